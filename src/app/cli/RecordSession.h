@@ -1,0 +1,27 @@
+#pragma once
+// What every command that reads records needs: job settings, the format service with the
+// record definition loaded, a record list and an engine, wired together.
+
+#include <memory>
+#include <string>
+
+#include "ConsoleDialogHost.h"
+#include "document/UListCtrl.h"
+#include "platform/job/UJobSettings.h"
+#include "records/UNeutralFileFormat.h"
+#include "reduction/UNeditDatabase.h"
+
+struct RecordSession {
+    RecordSession();
+    /// Loads the record definition; false, with a message on standard error, when it fails.
+    bool LoadDefinition();
+
+    UJobSettings settings;
+    UNeutralFileFormat format{&settings};
+    UListCtrl list{&format};
+    ConsoleDialogHost host;
+    UNeditDatabase engine{&format, &list, &host};
+};
+
+/// The directory holding the record definition: $SXNEDIT_DATA_DIR, else the build's data/.
+std::string DataDirectory();

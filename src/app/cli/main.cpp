@@ -1,0 +1,61 @@
+// sxnedit: the command line of SXNedit. Thin over the engine; errors are caught only here.
+
+#include <cstdio>
+#include <cstring>
+#include <exception>
+#include <string>
+#include <vector>
+
+#include "BuildInfo.h"
+#include "Commands.h"
+
+namespace {
+
+const char* const kUsage =
+    "Usage: sxnedit COMMAND [ARGUMENTS]\n"
+    "\n"
+    "Reads total-station observations held as neutral records.\n"
+    "\n"
+    "Commands:\n"
+    "  rows FILE.neu   print the records of a neutral file, one per line, as the\n"
+    "                  record list holds them (upper case, laid out, unknown keys\n"
+    "                  as comments)\n"
+    "\n"
+    "Options:\n"
+    "  -h, --help      show this help and exit\n"
+    "  --version       show the version and exit\n"
+    "\n"
+    "Exit status: 0 done, 1 failed, 2 an input file could not be read,\n"
+    "64 the command line is wrong.\n"
+    "Environment: SXNEDIT_DATA_DIR names the directory of the record definition.\n";
+
+int Dispatch(const std::vector<std::string>& words) {
+    if (words.empty()) {
+        std::fputs(kUsage, stderr);
+        return exit_status::Usage;
+    }
+    const std::string& command = words[0];
+    if (command == "-h" || command == "--help" || command == "help") {
+        std::fputs(kUsage, stdout);
+        return exit_status::Ok;
+    }
+    if (command == "--version") {
+        std::printf("sxnedit %s\n", SXNEDIT_VERSION);
+        return exit_status::Ok;
+    }
+    const std::vector<std::string> args(words.begin() + 1, words.end());
+    if (command == "rows") return RunRows(args);
+    std::fprintf(stderr, "sxnedit: unknown command '%s' (see sxnedit --help)\n", command.c_str());
+    return exit_status::Usage;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    try {
+        return Dispatch(std::vector<std::string>(argv + 1, argv + argc));
+    } catch (const std::exception& error) {
+        std::fprintf(stderr, "sxnedit: %s\n", error.what());
+        return exit_status::Failed;
+    }
+}

@@ -1,0 +1,69 @@
+#pragma once
+// Dialogs and message boxes in the middle of an algorithm go through a DialogHost that the
+// caller was given. The desktop shows real windows, the command line answers by policy or
+// at the terminal, and tests script the answers; the logic is the same in all three.
+
+#include <string>
+
+namespace nedit {
+
+/// Message box buttons, icons and answers, with the numbers the system has always used
+/// (a question with Yes and No is 36: YesNo | IconQuestion).
+namespace mb {
+constexpr unsigned Ok = 0x00;
+constexpr unsigned OkCancel = 0x01;
+constexpr unsigned AbortRetryIgnore = 0x02;
+constexpr unsigned YesNoCancel = 0x03;
+constexpr unsigned YesNo = 0x04;
+constexpr unsigned RetryCancel = 0x05;
+constexpr unsigned ButtonsMask = 0x0F;
+constexpr unsigned IconStop = 0x10;
+constexpr unsigned IconQuestion = 0x20;
+constexpr unsigned IconExclamation = 0x30;
+constexpr unsigned IconInformation = 0x40;
+constexpr unsigned IconMask = 0xF0;
+constexpr unsigned DefButton2 = 0x100;
+constexpr unsigned DefButton3 = 0x200;
+constexpr unsigned DefButtonMask = 0xF00;
+
+constexpr int IdOk = 1;
+constexpr int IdCancel = 2;
+constexpr int IdAbort = 3;
+constexpr int IdRetry = 4;
+constexpr int IdIgnore = 5;
+constexpr int IdYes = 6;
+constexpr int IdNo = 7;
+
+/// The answer given by the default button of a message box with these flags.
+int DefaultAnswer(unsigned flags);
+}  // namespace mb
+
+/// The logic of one modal dialog: its members, defaults and handlers. A host shows it and
+/// reports how it ended; everything else is tested without a screen.
+class UDialogLogic {
+public:
+    virtual ~UDialogLogic();
+    /// A stable name by which hosts and test scripts recognise the dialog.
+    virtual std::wstring DialogName() const = 0;
+    /// Called once before the dialog is shown.
+    virtual void OnInitDialog() {}
+    /// Validates and takes the values; false keeps the dialog open.
+    virtual bool OnOK() { return true; }
+    virtual void OnCancel() {}
+};
+
+class DialogHost {
+public:
+    virtual ~DialogHost();
+    /// Shows an already translated message; gives the answer (mb::IdOk, mb::IdYes, ...).
+    virtual int ShowMessage(const std::wstring& text, unsigned flags, unsigned help) = 0;
+    /// Runs a dialog modally; gives mb::IdOk when it was accepted, else mb::IdCancel or the
+    /// dialog's own end code.
+    virtual int RunDialog(UDialogLogic& dialog) = 0;
+};
+
+/// Shows `text` through `host`. Without a host nothing is shown and the default button's
+/// answer is given, so engines run unattended behave as if the user pressed Enter.
+int AppMessageBox(DialogHost* host, const std::wstring& text, unsigned flags, unsigned help = 0);
+
+}  // namespace nedit

@@ -1,0 +1,54 @@
+#pragma once
+// The record definition: which key names which record type, which fields each record has,
+// and how each field's value is read. Loaded from a definition text shipped under data/.
+
+#include <string>
+#include <unordered_map>
+#include <vector>
+
+/// How a field's value is read from a file.
+enum class FieldKind { Text, Angle, Length, Number, Integer };
+
+struct FieldDefinition {
+    int id = 0;
+    std::wstring key;
+    FieldKind kind = FieldKind::Text;
+};
+
+struct RecordDefinition {
+    int type = 0;
+    std::wstring key;
+    /// Ids of the named fields in layout order; empty for a single-field record.
+    std::vector<int> fields;
+    bool single_field = false;
+    /// For a single-field record: how its value is read, and the field id it stands for
+    /// (its own type when it stands for no field).
+    FieldKind single_kind = FieldKind::Text;
+    int stands_for = 0;
+};
+
+class RecordDefinitionTable {
+public:
+    /// Reads the definition text. Gives false and a message naming the line when a line
+    /// is not understood; the table is then left empty.
+    bool Parse(const std::wstring& text, std::wstring& error);
+
+    bool Empty() const { return records_.empty(); }
+    void Clear();
+
+    const RecordDefinition* RecordByType(int type) const;
+    const RecordDefinition* RecordByKey(const std::wstring& key) const;
+    /// Fields by id and by key. The key of a single-field record is also a field key, with
+    /// the record's type as its id, so that its one value can be named.
+    const FieldDefinition* FieldById(int id) const;
+    const FieldDefinition* FieldByKey(const std::wstring& key) const;
+
+private:
+    bool ParseLine(const std::vector<std::wstring>& words, std::wstring& error);
+    void AddField(FieldDefinition field);
+
+    std::unordered_map<int, RecordDefinition> records_;
+    std::unordered_map<std::wstring, int> record_types_by_key_;
+    std::unordered_map<int, FieldDefinition> fields_;
+    std::unordered_map<std::wstring, int> field_ids_by_key_;
+};

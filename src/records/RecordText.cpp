@@ -1,0 +1,75 @@
+#include "records/RecordText.h"
+
+#include "platform/text/WideText.h"
+
+std::wstring GetDelimToken(std::wstring_view text, int n, std::wstring_view delimiters) {
+    if (n < 0) return {};
+    std::size_t start = 0;
+    for (int index = 0; index < n; ++index) {
+        const std::size_t separator = text.find_first_of(delimiters, start);
+        if (separator == std::wstring_view::npos) return {};
+        start = separator + 1;
+    }
+    const std::size_t end = text.find_first_of(delimiters, start);
+    const std::size_t length = end == std::wstring_view::npos ? std::wstring_view::npos : end - start;
+    return nedit::ToUpper(nedit::Trim(text.substr(start, length)));
+}
+
+std::wstring GetToken(std::wstring_view text, int n) { return GetDelimToken(text, n, L" ,"); }
+
+std::wstring ReplaceToken(std::wstring_view record, int n, std::wstring_view value) {
+    if (n < 0) return std::wstring(record);
+    std::wstring out;
+    std::size_t start = 0;
+    int index = 0;
+    for (; index < n; ++index) {
+        const std::size_t comma = record.find(L',', start);
+        if (comma == std::wstring_view::npos) break;
+        start = comma + 1;
+    }
+    if (index < n) {
+        // Fewer tokens than asked for: pad with empty ones so the value lands at position n.
+        out.assign(record);
+        out.append(static_cast<std::size_t>(n - index), L',');
+        return out.append(value);
+    }
+    out.assign(record.substr(0, start));
+    if (n == 0) {
+        // The key and the blanks that pad it stay; the first field is what is replaced.
+        const std::size_t blank = record.find(L' ');
+        const std::size_t comma = record.find(L',');
+        if (blank != std::wstring_view::npos && (comma == std::wstring_view::npos || blank < comma)) {
+            const std::size_t field = record.find_first_not_of(L' ', blank);
+            out.assign(record.substr(0, field == std::wstring_view::npos ? record.size() : field));
+        }
+    }
+    out.append(value);
+    const std::size_t next = record.find(L',', start);
+    if (next != std::wstring_view::npos) out.append(record.substr(next));
+    return out;
+}
+
+std::wstring GetIdText(std::wstring_view record) {
+    const std::size_t comma = record.find(L',');
+    if (comma == std::wstring_view::npos) {
+        const std::size_t blank = record.find(L' ');
+        // A formatted row pads its key with blanks; the text meant is the field after them.
+        return blank == std::wstring_view::npos ? std::wstring() : nedit::TrimLeft(record.substr(blank + 1));
+    }
+    const std::size_t blank = record.rfind(L' ', comma);
+    const std::size_t start = blank == std::wstring_view::npos ? 0 : blank + 1;
+    return std::wstring(record.substr(start, comma - start));
+}
+
+int GetAngleType(std::wstring_view row) {
+    const std::size_t found = row.find(L"UA=");
+    if (found == std::wstring_view::npos) return 0;
+    std::size_t i = found + 3;
+    while (i < row.size() && row[i] == L' ') ++i;
+    if (i >= row.size()) return 0;
+    switch (row[i]) {
+        case L'1': case L'D': case L'd': return 1;
+        case L'2': case L'G': case L'g': return 2;
+        default: return 0;
+    }
+}

@@ -1,0 +1,26 @@
+#pragma once
+// Free functions on the text of a record row.
+
+#include <string>
+#include <string_view>
+
+/// The n-th token of `text`, tokens being separated by single blanks or commas, each
+/// separator counting (two blanks in a row make an empty token); trimmed and upper-cased.
+/// Token 0 of a record is its key. Empty when there is no n-th token.
+std::wstring GetToken(std::wstring_view text, int n);
+
+/// The same with the given set of delimiter characters.
+std::wstring GetDelimToken(std::wstring_view text, int n, std::wstring_view delimiters);
+
+/// The record with comma token `n` replaced by `value`; missing tokens are added empty.
+/// Token 0 holds the key and the first field, and its key stays in front of the new value.
+std::wstring ReplaceToken(std::wstring_view record, int n, std::wstring_view value);
+
+/// The text between the last blank before the first comma and that comma: for
+/// "STN       ID=P1,HI=1.500" it is "ID=P1". Without a comma the text after the first
+/// blank; without either, empty.
+std::wstring GetIdText(std::wstring_view record);
+
+/// The angular unit that a row sets with "UA=": 1 for "1" or "D", 2 for "2" or "G", else 0
+/// (also when the row has no "UA="). Blanks after "=" are skipped.
+int GetAngleType(std::wstring_view row);

@@ -1,0 +1,304 @@
+#include "records/UNeutralFileFormat.h"
+
+#include <algorithm>
+#include <fstream>
+#include <sstream>
+
+#include "platform/text/Format.h"
+#include "platform/text/NumberText.h"
+#include "platform/text/WideText.h"
+#include "records/RecordTypes.h"
+
+namespace {
+
+constexpr const wchar_t* kDefinitionFileName = L"NeutralRecords.def";
+
+bool IsControl(wchar_t c) { return (c >= 0 && c < 0x20) || c == 0x7F; }
+
+// The key of a record: its text up to the first blank or comma.
+std::wstring KeyOf(const std::wstring& text) {
+    const std::size_t end = text.find_first_of(L" ,");
+    return end == std::wstring::npos ? text : text.substr(0, end);
+}
+
+// The text after the key, trimmed.
+std::wstring AfterKey(const std::wstring& text) {
+    const std::size_t end = text.find_first_of(L" ,");
+    return end == std::wstring::npos ? std::wstring() : nedit::Trim(std::wstring_view(text).substr(end));
+}
+
+int WinTypeOf(FieldKind kind) {
+    switch (kind) {
+        case FieldKind::Integer: return 1;
+        case FieldKind::Length:
+        case FieldKind::Number: return 3;
+        case FieldKind::Angle: return 7;
+        default: return 6;
+    }
+}
+
+}  // namespace
+
+UNeutralFileFormat::UNeutralFileFormat(const UJobSettings* settings) : settings_(settings) {}
+
+UNeutralFileFormat::~UNeutralFileFormat() = default;
+
+void UNeutralFileFormat::InitMaps() { current_values_.clear(); }
+
+void UNeutralFileFormat::ClearMaps() {
+    definition_.Clear();
+    current_values_.clear();
+}
+
+bool UNeutralFileFormat::LoadNeutralFileDefinition(const std::wstring& dir) {
+    std::string path = nedit::ToUtf8(dir);
+    if (!path.empty() && path.back() != '/' && path.back() != '\\') path += '/';
+    path += nedit::ToUtf8(kDefinitionFileName);
+    std::ifstream file(path, std::ios::binary);
+    if (!file) {
+        definition_error_ = L"cannot read " + nedit::FromUtf8(path);
+        return false;
+    }
+    std::ostringstream bytes;
+    bytes << file.rdbuf();
+    return LoadDefinitionText(nedit::FromUtf8(bytes.str()));
+}
+
+bool UNeutralFileFormat::LoadDefinitionText(const std::wstring& text) {
+    definition_error_.clear();
+    return definition_.Parse(text, definition_error_);
+}
+
+bool UNeutralFileFormat::IsFileHeader(const std::wstring& line) const {
+    const std::wstring text = nedit::ToUpper(nedit::Trim(line));
+    return nedit::StartsWith(text, L"#VERSION-") && nedit::EndsWith(text, L" NEUTRAL FILE");
+}
+
+int UNeutralFileFormat::ExtractRecord(const std::wstring& line, std::wstring& record) const {
+    std::wstring text = line;
+    for (wchar_t& c : text) {
+        if (IsControl(c)) c = L' ';
+    }
+    text = nedit::Trim(text);
+    if (text.empty()) return 0;
+    record = std::move(text);
+    return 1;
+}
+
+int UNeutralFileFormat::GetRecordType(const std::wstring& line) const {
+    const std::wstring text = nedit::TrimLeft(line);
+    if (text.empty()) return rec::None;
+    if (text[0] == L'#') return rec::Comment;
+    int type = rec::None;
+    FindRecordKey(nedit::ToUpper(KeyOf(text)), type);
+    return type;
+}
+
+int UNeutralFileFormat::FindRecordKey(int type, std::wstring& key) const {
+    const RecordDefinition* record = definition_.RecordByType(type);
+    if (record == nullptr) return 0;
+    key = record->key;
+    return 1;
+}
+
+int UNeutralFileFormat::FindRecordKey(const std::wstring& key, int& type) const {
+    const RecordDefinition* record = definition_.RecordByKey(key);
+    if (record == nullptr) return 0;
+    type = record->type;
+    return 1;
+}
+
+int UNeutralFileFormat::FindRecordField(int id, std::wstring& key) const {
+    const FieldDefinition* field = definition_.FieldById(id);
+    if (field == nullptr) return 0;
+    key = field->key;
+    return 1;
+}
+
+int UNeutralFileFormat::FindRecordField(const std::wstring& key, int& id) const {
+    const FieldDefinition* field = definition_.FieldByKey(key);
+    if (field == nullptr) return 0;
+    id = field->id;
+    return 1;
+}
+
+int UNeutralFileFormat::FindFieldWinType(const std::wstring& key, int& type) const {
+    const FieldDefinition* field = definition_.FieldByKey(key);
+    if (field == nullptr) return 0;
+    type = WinTypeOf(field->kind);
+    return 1;
+}
+
+int UNeutralFileFormat::FindFieldsArray(int type) const {
+    const RecordDefinition* record = definition_.RecordByType(type);
+    if (record == nullptr) return 0;
+    return record->single_field ? 1 : static_cast<int>(record->fields.size());
+}
+
+bool UNeutralFileFormat::IsKeyOfSingleField(int type) const {
+    const RecordDefinition* record = definition_.RecordByType(type);
+    return record != nullptr && record->single_field;
+}
+
+int UNeutralFileFormat::GetFieldId(int type) const {
+    const RecordDefinition* record = definition_.RecordByType(type);
+    return record != nullptr && record->single_field ? record->stands_for : 0;
+}
+
+int UNeutralFileFormat::ProcessRecord(int type, const std::wstring& line, FieldMap& fields) {
+    fields.clear();
+    const RecordDefinition* record = definition_.RecordByType(type);
+    if (record == nullptr || (!record->single_field && record->fields.empty())) return 0;
+    const std::wstring body = AfterKey(nedit::Trim(line));
+    if (record->single_field) {
+        StoreField(record->type, record->single_kind, body, fields);
+        return 1;
+    }
+    std::size_t position = 0;
+    std::size_t start = 0;
+    while (start <= body.size()) {
+        std::size_t comma = body.find(L',', start);
+        if (comma == std::wstring::npos) comma = body.size();
+        const std::wstring token = nedit::Trim(std::wstring_view(body).substr(start, comma - start));
+        const std::size_t equals = token.find(L'=');
+        if (equals != std::wstring::npos) {
+            const FieldDefinition* field = definition_.FieldByKey(nedit::ToUpper(nedit::Trim(token.substr(0, equals))));
+            // A key that the definition does not know is passed over, not guessed at.
+            if (field != nullptr) StoreField(field->id, field->kind, nedit::Trim(token.substr(equals + 1)), fields);
+        } else if (position < record->fields.size() && !token.empty()) {
+            const FieldDefinition* field = definition_.FieldById(record->fields[position]);
+            if (field != nullptr) StoreField(field->id, field->kind, token, fields);
+        }
+        ++position;
+        start = comma + 1;
+    }
+    return 1;
+}
+
+void UNeutralFileFormat::StoreField(int id, FieldKind kind, const std::wstring& text, FieldMap& fields) {
+    std::wstring value = ReadValue(kind, text);
+    if (!value.empty()) current_values_[id] = value;
+    fields[id] = std::move(value);
+}
+
+std::wstring UNeutralFileFormat::ReadValue(FieldKind kind, const std::wstring& text) const {
+    if (text.empty()) return text;
+    switch (kind) {
+        case FieldKind::Angle:
+            if (FileAngleUnit() == nedit::AngleUnit::Degrees) return text;
+            return nedit::DoubleToText(ConvertAngle(nedit::TextToDouble(text)));
+        case FieldKind::Length:
+            if (FileLengthUnit() == WorkingLengthUnit()) return text;
+            return nedit::DoubleToText(ConvertDist(nedit::TextToDouble(text), false));
+        default:
+            return text;
+    }
+}
+
+std::wstring UNeutralFileFormat::FormatRecord(int /*type*/, const std::wstring& line) const {
+    const std::wstring_view text = nedit::TrimView(line);
+    if (text.empty() || text[0] == L'#') return std::wstring(text);
+    const std::size_t key_end = std::min(text.find_first_of(L" ,"), text.size());
+    const std::wstring_view key = text.substr(0, key_end);
+    const std::wstring_view body = nedit::TrimView(text.substr(key_end));
+
+    // "%-9s %s": the key padded to nine places and a blank, then the fields.
+    std::wstring out;
+    out.reserve(std::max<std::size_t>(key.size(), 9) + 1 + body.size());
+    out.append(key);
+    if (key.size() < 9) out.append(9 - key.size(), L' ');
+    out += L' ';
+    if (body.find_first_of(L",=") == std::wstring_view::npos) {
+        out.append(body);
+    } else {
+        for (std::size_t start = 0; start <= body.size();) {
+            const std::size_t comma = std::min(body.find(L',', start), body.size());
+            const std::wstring_view token = nedit::TrimView(body.substr(start, comma - start));
+            if (start > 0) out += L',';
+            const std::size_t equals = token.find(L'=');
+            if (equals == std::wstring_view::npos) {
+                out.append(token);
+            } else {
+                out.append(nedit::TrimRightView(token.substr(0, equals)));
+                out += L'=';
+                out.append(nedit::TrimLeftView(token.substr(equals + 1)));
+            }
+            start = comma + 1;
+        }
+    }
+    out.resize(nedit::TrimRightView(out).size());
+    return out;
+}
+
+std::wstring UNeutralFileFormat::ReformatRecord(const std::wstring& record, const std::wstring& id) const {
+    const std::size_t comma = record.find(L',');
+    if (comma == std::wstring::npos) return record;
+    const std::size_t first_blank = record.find(L' ');
+    const std::wstring key = nedit::ToUpper(nedit::Trim(std::wstring_view(record).substr(0, first_blank)));
+    const std::size_t last_blank = record.rfind(L' ', comma);
+    const std::size_t rest = last_blank == std::wstring::npos ? 0 : last_blank + 1;
+    return nedit::Format(L"%-10s%s,%s", key, id, std::wstring_view(record).substr(rest));
+}
+
+std::wstring UNeutralFileFormat::MakeUpperCaseString(const std::wstring& text) const {
+    return nedit::ToUpper(text);
+}
+
+int UNeutralFileFormat::GetStringCount(const std::wstring& text, wchar_t c) const {
+    return nedit::CountOf(text, c);
+}
+
+std::wstring UNeutralFileFormat::GetCurrentValue(int id) const {
+    const auto found = current_values_.find(id);
+    return found == current_values_.end() ? std::wstring() : found->second;
+}
+
+void UNeutralFileFormat::SetCurrentValue(int id, const std::wstring& value) { current_values_[id] = value; }
+
+void UNeutralFileFormat::ResetCurrentValues() { current_values_.clear(); }
+
+void UNeutralFileFormat::InitUnitsAndAngleModes(wchar_t& angle, wchar_t& length, wchar_t& hmode,
+                                                wchar_t& vmode) const {
+    angle = nedit::LetterOf(settings_ ? settings_->GetAngleUnit() : nedit::AngleUnit::DegMinSec);
+    length = nedit::LetterOf(WorkingLengthUnit());
+    hmode = L'A';
+    vmode = L'Z';
+}
+
+double UNeutralFileFormat::ConvertToZenithVA(double reading) const {
+    switch (CurrentLetter(fld::VMode, L'Z')) {
+        case L'N': return 180.0 - reading;
+        case L'A': return 90.0 - reading;
+        default: return reading;
+    }
+}
+
+double UNeutralFileFormat::ConvertDist(double value, bool to_file) const {
+    return to_file ? nedit::ConvertLength(value, WorkingLengthUnit(), FileLengthUnit())
+                   : nedit::ConvertLength(value, FileLengthUnit(), WorkingLengthUnit());
+}
+
+double UNeutralFileFormat::ConvertAngle(double value) const { return nedit::ToDegrees(value, FileAngleUnit()); }
+
+double UNeutralFileFormat::ConvertToAngleDisplayUnit(double degrees) const {
+    return nedit::FromDegrees(degrees, settings_ ? settings_->GetAngleUnit() : nedit::AngleUnit::DegMinSec);
+}
+
+nedit::LengthUnit UNeutralFileFormat::WorkingLengthUnit() const {
+    return settings_ ? settings_->GetLengthUnit() : nedit::LengthUnit::Metres;
+}
+
+nedit::LengthUnit UNeutralFileFormat::FileLengthUnit() const {
+    return nedit::LengthUnitFromLetter(CurrentLetter(fld::UL, nedit::LetterOf(WorkingLengthUnit())));
+}
+
+nedit::AngleUnit UNeutralFileFormat::FileAngleUnit() const {
+    const wchar_t job = nedit::LetterOf(settings_ ? settings_->GetAngleUnit() : nedit::AngleUnit::DegMinSec);
+    return nedit::AngleUnitFromLetter(CurrentLetter(fld::UA, job));
+}
+
+wchar_t UNeutralFileFormat::CurrentLetter(int id, wchar_t fallback) const {
+    const auto found = current_values_.find(id);
+    if (found == current_values_.end() || found->second.empty()) return fallback;
+    return nedit::ToUpper(found->second.substr(0, 1))[0];
+}

@@ -1,0 +1,113 @@
+#pragma once
+// The record-definition service: everything that parses or lays out a neutral record goes
+// through it. It knows the keys and fields of every record type, reads values in the
+// file's units and modes, and remembers the current value of each field, so that a field
+// left out of a record takes the value it last had in the file.
+//
+// Units: the file's linear and angular units and its vertical mode are the current values
+// of the fields UL, UA and VM. Parsing a UNIT or AMODE record therefore switches the units
+// for the records after it; with no such record the job's units, and the zenith mode, hold.
+// Values handed out are in working units: lengths in the job's unit, angles in degrees.
+
+#include <map>
+#include <string>
+#include <unordered_map>
+
+#include "platform/job/UJobSettings.h"
+#include "records/RecordDefinition.h"
+
+/// Field id to value text, as a parsed record gives it. A single-field record keeps its
+/// value under its own type number.
+using FieldMap = std::map<int, std::wstring>;
+
+class UNeutralFileFormat {
+public:
+    /// Binds the service to the job's settings, from which the working units are read.
+    /// The settings must outlive the service; without them metres and ddd.mmss hold.
+    explicit UNeutralFileFormat(const UJobSettings* settings);
+    virtual ~UNeutralFileFormat();
+    UNeutralFileFormat(const UNeutralFileFormat&) = delete;
+    UNeutralFileFormat& operator=(const UNeutralFileFormat&) = delete;
+
+    void InitMaps();
+    void ClearMaps();
+    /// Loads "NeutralRecords.def" from `dir` (with or without a trailing separator).
+    /// Gives false when it cannot be read or understood; LastDefinitionError() says why.
+    bool LoadNeutralFileDefinition(const std::wstring& dir);
+    /// The same from the text of a definition.
+    bool LoadDefinitionText(const std::wstring& text);
+    const std::wstring& LastDefinitionError() const { return definition_error_; }
+    bool IsKeysInitialised() const { return !definition_.Empty(); }
+
+    /// True when the trimmed, upper-cased line is a neutral file header: "#VERSION-",
+    /// a version, and " NEUTRAL FILE" at its end.
+    bool IsFileHeader(const std::wstring& line) const;
+    /// 0 when the line holds no record, i.e. nothing is left once control characters are
+    /// blanked and the ends trimmed; otherwise 1 with that text in `record`.
+    int ExtractRecord(const std::wstring& line, std::wstring& record) const;
+    /// The type of a row: 99 for a comment, the type of its key, or 0 for an unknown key.
+    int GetRecordType(const std::wstring& line) const;
+
+    int FindRecordKey(int type, std::wstring& key) const;
+    int FindRecordKey(const std::wstring& key, int& type) const;
+    int FindRecordField(int id, std::wstring& key) const;
+    int FindRecordField(const std::wstring& key, int& id) const;
+    /// The kind of edit control of a field: 1 whole number, 3 real number, 7 angle,
+    /// 6 plain text. Gives 0 for an unknown key.
+    int FindFieldWinType(const std::wstring& key, int& type) const;
+    /// How many fields the type has (1 for a single-field record); 0 for none.
+    int FindFieldsArray(int type) const;
+    bool IsKeyOfSingleField(int type) const;
+    /// The field id that a single-field record stands for; its own type when it stands for
+    /// no other field; 0 for a type that is not a single-field record.
+    int GetFieldId(int type) const;
+
+    /// Parses `line` as a record of `type` into `fields`, lengths and angles in working
+    /// units. A field is named ("HA=123.4530") or, without "=", taken by its position in
+    /// the record's layout. Every non-empty value becomes the field's current value.
+    /// Gives 0, with `fields` empty, for an unknown type or a type without fields.
+    int ProcessRecord(int type, const std::wstring& line, FieldMap& fields);
+
+    /// The record laid out in the standard way: the key padded to nine characters and a
+    /// blank, then the fields separated by commas, blanks around "=" and "," removed.
+    /// Values are not touched. A comment or an empty text is given back as it is.
+    std::wstring FormatRecord(int type, const std::wstring& line) const;
+    /// The record with `id` inserted as its first field: "%-10s%s,%s" of the key, `id`, and
+    /// the text from the first field on. A record without a comma is given back unchanged.
+    std::wstring ReformatRecord(const std::wstring& record, const std::wstring& id) const;
+
+    std::wstring MakeUpperCaseString(const std::wstring& text) const;
+    int GetStringCount(const std::wstring& text, wchar_t c) const;
+
+    std::wstring GetCurrentValue(int id) const;
+    void SetCurrentValue(int id, const std::wstring& value);
+    void ResetCurrentValues();
+
+    /// The job's angle and length letters, and the start modes "A" and "Z".
+    void InitUnitsAndAngleModes(wchar_t& angle, wchar_t& length, wchar_t& hmode, wchar_t& vmode) const;
+    /// A vertical reading in degrees, in the current vertical mode, as a zenith angle:
+    /// "Z" zenith as it is, "N" nadir (180 - v), "A" above the horizon (90 - v).
+    double ConvertToZenithVA(double reading) const;
+    /// true: working length to file length; false: file length to working length.
+    double ConvertDist(double value, bool to_file) const;
+    /// A file angle, in the current angular unit, to degrees.
+    double ConvertAngle(double value) const;
+    /// Degrees to the job's angle display unit (ddd.mmss, degrees or gons).
+    double ConvertToAngleDisplayUnit(double degrees) const;
+
+    const UJobSettings* GetJobSettings() const { return settings_; }
+
+private:
+    nedit::LengthUnit WorkingLengthUnit() const;
+    nedit::LengthUnit FileLengthUnit() const;
+    nedit::AngleUnit FileAngleUnit() const;
+    wchar_t CurrentLetter(int id, wchar_t fallback) const;
+    /// A value text read in the file's units, given back in working units.
+    std::wstring ReadValue(FieldKind kind, const std::wstring& text) const;
+    void StoreField(int id, FieldKind kind, const std::wstring& text, FieldMap& fields);
+
+    const UJobSettings* settings_;
+    RecordDefinitionTable definition_;
+    std::wstring definition_error_;
+    std::unordered_map<int, std::wstring> current_values_;
+};

@@ -1,0 +1,38 @@
+#include "platform/text/NumberText.h"
+
+#include <gtest/gtest.h>
+
+#include <climits>
+
+using namespace nedit;
+
+TEST(NumberText, TextToDoubleReadsTheLeadingNumberOrGivesZero) {
+    struct Case {
+        const wchar_t* text;
+        double expected;
+    };
+    const Case cases[] = {
+        {L"35.214", 35.214},  {L"  -2.5", -2.5},    {L"+7", 7.0},        {L"12.5M", 12.5},
+        {L"1.5e3", 1500.0},   {L".5", 0.5},         {L"", 0.0},          {L"ABC", 0.0},
+        {L"--3", 0.0},        {L"nan", 0.0},        {L"inf", 0.0},       {L"1e400", 0.0},
+        {L"1,5", 1.0},        {L"0.99960", 0.9996},
+    };
+    for (const Case& c : cases) EXPECT_DOUBLE_EQ(TextToDouble(c.text), c.expected) << c.text;
+}
+
+TEST(NumberText, TextToIntReadsTheLeadingWholeNumber) {
+    EXPECT_EQ(TextToInt(L"42"), 42);
+    EXPECT_EQ(TextToInt(L" -7x"), -7);
+    EXPECT_EQ(TextToInt(L"3.9"), 3);
+    EXPECT_EQ(TextToInt(L"x3"), 0);
+    EXPECT_EQ(TextToInt(L"99999999999"), INT_MAX);
+    EXPECT_EQ(TextToInt(L"-99999999999"), INT_MIN);
+}
+
+TEST(NumberText, DoubleToTextIsShortestAndExact) {
+    EXPECT_EQ(DoubleToText(35.214), L"35.214");
+    EXPECT_EQ(DoubleToText(-2.0), L"-2");
+    EXPECT_EQ(DoubleToText(0.1 + 0.2), L"0.30000000000000004");
+    const double awkward = 123.0 + 45.0 / 60.0 + 30.0 / 3600.0;
+    EXPECT_EQ(TextToDouble(DoubleToText(awkward)), awkward);
+}
