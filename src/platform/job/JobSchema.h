@@ -1,0 +1,8 @@
+#pragma once
+// The job schema's SQL, one text per version, compiled in from data/schema/NNN_*.sql.
+
+namespace nedit {
+
+extern const char kJobSchemaV1[];
+
+}  // namespace nedit

@@ -1,0 +1,32 @@
+#pragma once
+// A circle of the job about one of its points.
+
+#include "platform/job/UDBObject.h"
+
+class UDBCircle : public UDBObject {
+  public:
+    explicit UDBCircle(USurveyDoc* job, long id = 0);
+
+    bool Load(long id) override;
+    /// False (LastError) when the centre is not a point of the job, the radius is not above
+    /// 0, or the stored circle is locked.
+    bool Save(int undoFlag = 0, bool redraw = false, bool select = false) override;
+
+    long GetCentreId() const { return centre_; }
+    void SetCentreId(long centre) { centre_ = centre; }
+    double GetRadius() const { return radius_; }
+    void SetRadius(double radius) { radius_ = radius; }
+    int GetLineStyle() const { return line_style_; }
+    void SetLineStyle(int style) { line_style_ = style; }
+    int GetThickness() const { return thickness_; }
+    void SetThickness(int thickness) { thickness_ = thickness; }
+
+  protected:
+    const char* AreaQuery() const override;
+
+  private:
+    long centre_ = 0;
+    double radius_ = 0.0;
+    int line_style_ = 0;
+    int thickness_ = 0;
+};

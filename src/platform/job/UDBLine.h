@@ -1,0 +1,36 @@
+#pragma once
+// A line of the job between two of its points, with layer, colour, line style, thickness and
+// flags.
+
+#include "platform/job/UDBObject.h"
+
+class UDBLine : public UDBObject {
+  public:
+    /// A line of the job; with an identifier other than 0 it is loaded.
+    explicit UDBLine(USurveyDoc* job, long id = 0);
+
+    bool Load(long id) override;
+    /// False (LastError) when an end is not a point of the job, both ends are one point, or
+    /// the stored line is locked.
+    bool Save(int undoFlag = 0, bool redraw = false, bool select = false) override;
+
+    long GetStartPointId() const { return start_; }
+    long GetEndPointId() const { return end_; }
+    void SetPoints(long start, long end) {
+        start_ = start;
+        end_ = end;
+    }
+    int GetLineStyle() const { return line_style_; }
+    void SetLineStyle(int style) { line_style_ = style; }
+    int GetThickness() const { return thickness_; }
+    void SetThickness(int thickness) { thickness_ = thickness; }
+
+  protected:
+    const char* AreaQuery() const override;
+
+  private:
+    long start_ = 0;
+    long end_ = 0;
+    int line_style_ = 0;
+    int thickness_ = 0;
+};
