@@ -6,6 +6,7 @@
 #include <fstream>
 #include <string>
 
+#include "BenchSupport.h"
 #include "document/UListCtrl.h"
 #include "platform/job/UJobSettings.h"
 #include "records/UNeutralFileFormat.h"
@@ -35,12 +36,9 @@ void LoadNeutralFile(benchmark::State& state) {
     const std::string path = MakeSurvey(state.range(0));
     UJobSettings settings;
     UNeutralFileFormat format(&settings);
-    if (!format.LoadNeutralFileDefinition(L"" SXNEDIT_DATA_DIR)) {
-        state.SkipWithError("record definition missing");
-        return;
-    }
+    if (!LoadDefinition(format, state)) return;
     UListCtrl list(&format);
-    UNeditDatabase engine(&format, &list, nullptr);
+    UNeditDatabase engine(&format, &list, nullptr, nullptr);
     const std::wstring wide_path(path.begin(), path.end());
     for (auto _ : state) {
         benchmark::DoNotOptimize(engine.LoadNeFile(wide_path));

@@ -40,3 +40,7 @@ std::wstring UListCtrl::GetItemText(int row) const {
     if (row < 0 || row >= GetItemCount()) return {};
     return rows_[static_cast<std::size_t>(row)];
 }
+
+void UListCtrl::DeleteItem(int row) {
+    if (row >= 0 && row < GetItemCount()) rows_.erase(rows_.begin() + row);
+}

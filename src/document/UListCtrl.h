@@ -27,7 +27,11 @@ public:
     /// The row's text; empty for a row that does not exist.
     std::wstring GetItemText(int row) const;
     void DeleteAllItems() { rows_.clear(); }
+    /// Removes the row; a row that does not exist is left alone.
+    void DeleteItem(int row);
     void Reserve(std::size_t rows) { rows_.reserve(rows); }
+    /// All rows, in order, for readers that walk the whole list.
+    const std::vector<std::wstring>& GetRows() const { return rows_; }
 
 private:
     const UNeutralFileFormat* format_;

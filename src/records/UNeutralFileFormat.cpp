@@ -15,16 +15,9 @@ constexpr const wchar_t* kDefinitionFileName = L"NeutralRecords.def";
 
 bool IsControl(wchar_t c) { return (c >= 0 && c < 0x20) || c == 0x7F; }
 
-// The key of a record: its text up to the first blank or comma.
-std::wstring KeyOf(const std::wstring& text) {
-    const std::size_t end = text.find_first_of(L" ,");
-    return end == std::wstring::npos ? text : text.substr(0, end);
-}
-
-// The text after the key, trimmed.
-std::wstring AfterKey(const std::wstring& text) {
-    const std::size_t end = text.find_first_of(L" ,");
-    return end == std::wstring::npos ? std::wstring() : nedit::Trim(std::wstring_view(text).substr(end));
+// The key of a record: its text up to the first blank or comma, in upper case.
+std::wstring KeyOf(std::wstring_view text) {
+    return nedit::ToUpper(text.substr(0, std::min(text.find_first_of(L" ,"), text.size())));
 }
 
 int WinTypeOf(FieldKind kind) {
@@ -86,12 +79,11 @@ int UNeutralFileFormat::ExtractRecord(const std::wstring& line, std::wstring& re
 }
 
 int UNeutralFileFormat::GetRecordType(const std::wstring& line) const {
-    const std::wstring text = nedit::TrimLeft(line);
+    const std::wstring_view text = nedit::TrimLeftView(line);
     if (text.empty()) return rec::None;
     if (text[0] == L'#') return rec::Comment;
-    int type = rec::None;
-    FindRecordKey(nedit::ToUpper(KeyOf(text)), type);
-    return type;
+    const RecordDefinition* record = definition_.RecordByKey(KeyOf(text));
+    return record == nullptr ? rec::None : record->type;
 }
 
 int UNeutralFileFormat::FindRecordKey(int type, std::wstring& key) const {
@@ -149,49 +141,49 @@ int UNeutralFileFormat::ProcessRecord(int type, const std::wstring& line, FieldM
     fields.clear();
     const RecordDefinition* record = definition_.RecordByType(type);
     if (record == nullptr || (!record->single_field && record->fields.empty())) return 0;
-    const std::wstring body = AfterKey(nedit::Trim(line));
+    const std::wstring_view text = nedit::TrimView(line);
+    const std::size_t key_end = std::min(text.find_first_of(L" ,"), text.size());
+    const std::wstring_view body = nedit::TrimView(text.substr(key_end));
     if (record->single_field) {
         StoreField(record->type, record->single_kind, body, fields);
         return 1;
     }
     std::size_t position = 0;
-    std::size_t start = 0;
-    while (start <= body.size()) {
-        std::size_t comma = body.find(L',', start);
-        if (comma == std::wstring::npos) comma = body.size();
-        const std::wstring token = nedit::Trim(std::wstring_view(body).substr(start, comma - start));
-        const std::size_t equals = token.find(L'=');
-        if (equals != std::wstring::npos) {
-            const FieldDefinition* field = definition_.FieldByKey(nedit::ToUpper(nedit::Trim(token.substr(0, equals))));
-            // A key that the definition does not know is passed over, not guessed at.
-            if (field != nullptr) StoreField(field->id, field->kind, nedit::Trim(token.substr(equals + 1)), fields);
-        } else if (position < record->fields.size() && !token.empty()) {
-            const FieldDefinition* field = definition_.FieldById(record->fields[position]);
-            if (field != nullptr) StoreField(field->id, field->kind, token, fields);
-        }
-        ++position;
+    for (std::size_t start = 0; start <= body.size(); ++position) {
+        const std::size_t comma = std::min(body.find(L',', start), body.size());
+        const std::wstring_view token = nedit::TrimView(body.substr(start, comma - start));
         start = comma + 1;
+        const std::size_t equals = token.find(L'=');
+        const FieldDefinition* field = nullptr;
+        std::wstring_view value = token;
+        if (equals != std::wstring_view::npos) {
+            // A key that the definition does not know is passed over, not guessed at.
+            field = definition_.FieldByKey(nedit::ToUpper(nedit::TrimView(token.substr(0, equals))));
+            value = nedit::TrimView(token.substr(equals + 1));
+        } else if (position < record->fields.size() && !token.empty()) {
+            field = definition_.FieldById(record->fields[position]);
+        }
+        if (field != nullptr) StoreField(field->id, field->kind, value, fields);
     }
     return 1;
 }
 
-void UNeutralFileFormat::StoreField(int id, FieldKind kind, const std::wstring& text, FieldMap& fields) {
-    std::wstring value = ReadValue(kind, text);
+void UNeutralFileFormat::StoreField(int id, FieldKind kind, std::wstring_view text, FieldMap& fields) {
+    std::wstring& value = fields[id];
+    ReadValue(kind, text, value);
     if (!value.empty()) current_values_[id] = value;
-    fields[id] = std::move(value);
 }
 
-std::wstring UNeutralFileFormat::ReadValue(FieldKind kind, const std::wstring& text) const {
-    if (text.empty()) return text;
-    switch (kind) {
-        case FieldKind::Angle:
-            if (FileAngleUnit() == nedit::AngleUnit::Degrees) return text;
-            return nedit::DoubleToText(ConvertAngle(nedit::TextToDouble(text)));
-        case FieldKind::Length:
-            if (FileLengthUnit() == WorkingLengthUnit()) return text;
-            return nedit::DoubleToText(ConvertDist(nedit::TextToDouble(text), false));
-        default:
-            return text;
+void UNeutralFileFormat::ReadValue(FieldKind kind, std::wstring_view text, std::wstring& value) const {
+    const bool converted = !text.empty() &&
+                           ((kind == FieldKind::Angle && FileAngleUnit() != nedit::AngleUnit::Degrees) ||
+                            (kind == FieldKind::Length && FileLengthUnit() != WorkingLengthUnit()));
+    if (!converted) {
+        value.assign(text);
+    } else if (kind == FieldKind::Angle) {
+        value = nedit::DoubleToText(ConvertAngle(nedit::TextToDouble(text)));
+    } else {
+        value = nedit::DoubleToText(ConvertDist(nedit::TextToDouble(text), false));
     }
 }
 
@@ -248,9 +240,10 @@ int UNeutralFileFormat::GetStringCount(const std::wstring& text, wchar_t c) cons
     return nedit::CountOf(text, c);
 }
 
-std::wstring UNeutralFileFormat::GetCurrentValue(int id) const {
+const std::wstring& UNeutralFileFormat::GetCurrentValue(int id) const {
+    static const std::wstring kNone;
     const auto found = current_values_.find(id);
-    return found == current_values_.end() ? std::wstring() : found->second;
+    return found == current_values_.end() ? kNone : found->second;
 }
 
 void UNeutralFileFormat::SetCurrentValue(int id, const std::wstring& value) { current_values_[id] = value; }

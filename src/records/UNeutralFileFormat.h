@@ -9,16 +9,12 @@
 // for the records after it; with no such record the job's units, and the zenith mode, hold.
 // Values handed out are in working units: lengths in the job's unit, angles in degrees.
 
-#include <map>
 #include <string>
 #include <unordered_map>
 
 #include "platform/job/UJobSettings.h"
+#include "records/FieldMap.h"
 #include "records/RecordDefinition.h"
-
-/// Field id to value text, as a parsed record gives it. A single-field record keeps its
-/// value under its own type number.
-using FieldMap = std::map<int, std::wstring>;
 
 class UNeutralFileFormat {
 public:
@@ -64,7 +60,8 @@ public:
 
     /// Parses `line` as a record of `type` into `fields`, lengths and angles in working
     /// units. A field is named ("HA=123.4530") or, without "=", taken by its position in
-    /// the record's layout. Every non-empty value becomes the field's current value.
+    /// the record's layout. Every non-empty value becomes the field's current value. A
+    /// single-field record keeps its value under its own type number.
     /// Gives 0, with `fields` empty, for an unknown type or a type without fields.
     int ProcessRecord(int type, const std::wstring& line, FieldMap& fields);
 
@@ -79,7 +76,8 @@ public:
     std::wstring MakeUpperCaseString(const std::wstring& text) const;
     int GetStringCount(const std::wstring& text, wchar_t c) const;
 
-    std::wstring GetCurrentValue(int id) const;
+    /// The current value of a field; empty when it has none. Valid until the next parse.
+    const std::wstring& GetCurrentValue(int id) const;
     void SetCurrentValue(int id, const std::wstring& value);
     void ResetCurrentValues();
 
@@ -102,9 +100,9 @@ private:
     nedit::LengthUnit FileLengthUnit() const;
     nedit::AngleUnit FileAngleUnit() const;
     wchar_t CurrentLetter(int id, wchar_t fallback) const;
-    /// A value text read in the file's units, given back in working units.
-    std::wstring ReadValue(FieldKind kind, const std::wstring& text) const;
-    void StoreField(int id, FieldKind kind, const std::wstring& text, FieldMap& fields);
+    /// A value text read in the file's units, written into `value` in working units.
+    void ReadValue(FieldKind kind, std::wstring_view text, std::wstring& value) const;
+    void StoreField(int id, FieldKind kind, std::wstring_view text, FieldMap& fields);
 
     const UJobSettings* settings_;
     RecordDefinitionTable definition_;

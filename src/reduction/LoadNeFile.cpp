@@ -3,7 +3,6 @@
 #include "document/UListCtrl.h"
 #include "platform/io/LineReader.h"
 #include "platform/messages/DialogHost.h"
-#include "platform/messages/ProgressSink.h"
 #include "platform/messages/Translate.h"
 #include "platform/text/WideText.h"
 #include "records/RecordText.h"
@@ -22,12 +21,12 @@ bool LacksOwnId(const std::wstring& row) { return nedit::CountOf(row, L',') <= 2
 }  // namespace
 
 int UNeditDatabase::LoadNeFile(const std::wstring& path) {
-    if (list_ == nullptr || format_ == nullptr) return 0;
-    list_->DeleteAllItems();
+    if (ListCtrl == nullptr || Doc == nullptr) return 0;
+    ListCtrl->DeleteAllItems();
 
     nedit::LineReader reader;
     if (!reader.Open(nedit::ToUtf8(path))) {
-        nedit::AppMessageBox(host_, nedit::Translate(L"Failed to open {1}.", {path}), nedit::mb::IconStop);
+        nedit::AppMessageBox(Host, nedit::Translate(L"Failed to open {1}.", {path}), nedit::mb::IconStop);
         return 0;
     }
 
@@ -36,17 +35,17 @@ int UNeditDatabase::LoadNeFile(const std::wstring& path) {
     std::wstring id_text;  // the ID field of the last station or back-bearing record
     std::string bytes;
     for (int lines_read = 0; reader.ReadLine(bytes); ++lines_read) {
-        if (progress_ != nullptr && lines_read % kProgressEvery == 0 && reader.Size() > 0) {
-            progress_->Update(static_cast<int>(100 * reader.Position() / reader.Size()), L"Loading");
+        if (lines_read % kProgressEvery == 0 && reader.Size() > 0) {
+            UpdateProgress(static_cast<unsigned>(100 * reader.Position() / reader.Size()), L"Loading");
         }
         const std::wstring decoded = nedit::DecodeTextLine(bytes);
         const std::wstring_view trimmed = nedit::TrimView(decoded);
         if (trimmed.empty()) continue;
-        const std::wstring line = format_->MakeUpperCaseString(std::wstring(trimmed));
+        const std::wstring line = Doc->MakeUpperCaseString(std::wstring(trimmed));
 
         if (!header_found) {
-            if (!format_->IsFileHeader(line)) {
-                nedit::AppMessageBox(host_, nedit::Translate(L"Neutral file header not found."),
+            if (!Doc->IsFileHeader(line)) {
+                nedit::AppMessageBox(Host, nedit::Translate(L"Neutral file header not found."),
                                      nedit::mb::IconStop);
                 break;
             }
@@ -58,21 +57,21 @@ int UNeditDatabase::LoadNeFile(const std::wstring& path) {
         if (line[0] == L'#') {
             row = line;
         } else {
-            if (!format_->ExtractRecord(line, row)) continue;
-            format_->FindRecordKey(row.substr(0, row.find_first_of(L" ,")), type);  // token 0
+            if (!Doc->ExtractRecord(line, row)) continue;
+            Doc->FindRecordKey(row.substr(0, row.find_first_of(L" ,")), type);  // token 0
         }
         row = nedit::Left(row, kMaxRowLength);
 
-        if ((type == rec::Unit || type == rec::Unit2) && angle_type_handler_) {
-            angle_type_handler_(::GetAngleType(row));
+        if ((type == rec::Unit || type == rec::Unit2) && AngleTypeHandler) {
+            AngleTypeHandler(::GetAngleType(row));
         }
         if (type == rec::Stn || type == rec::Bkb) id_text = GetIdText(row);
-        if (type == rec::Xyz && LacksOwnId(row)) row = format_->ReformatRecord(row, id_text);
+        if (type == rec::Xyz && LacksOwnId(row)) row = Doc->ReformatRecord(row, id_text);
 
-        if (list_->AddRecord(next_row, row) >= 0) ++next_row;
+        if (ListCtrl->AddRecord(next_row, row) >= 0) ++next_row;
     }
 
-    if (list_->GetItemCount() == 0) return 0;
-    output_ = true;
+    if (ListCtrl->GetItemCount() == 0) return 0;
+    Output = true;
     return 1;
 }

@@ -1,15 +1,175 @@
+// The engine's life and its runs: construction, the stages of a run in order, the re-runs,
+// the error table and the record of what the rows held at the last good run.
+
 #include "reduction/UNeditDatabase.h"
 
-UNeditDatabase::UNeditDatabase(UNeutralFileFormat* format, UListCtrl* list, nedit::DialogHost* host,
-                               nedit::ProgressSink* progress)
-    : format_(format), list_(list), host_(host), progress_(progress) {}
+#include <cstdio>
 
-UNeditDatabase::~UNeditDatabase() = default;
+#include "document/UListCtrl.h"
+#include "platform/messages/DialogHost.h"
+#include "platform/messages/ProgressSink.h"
+#include "platform/messages/Translate.h"
+#include "platform/text/WideText.h"
+#include "records/RecordTypes.h"
+
+namespace {
+
+// Rows of these types are no content: changing them does not call for a new reduction.
+bool IsContentType(int type) {
+    switch (type) {
+        case rec::Comment: case rec::Note: case rec::Job: case rec::Date:
+        case rec::Name: case rec::Drec: case rec::Instru: case rec::Edm:
+            return false;
+        default:
+            return true;
+    }
+}
+
+}  // namespace
+
+UNeditDatabase::UNeditDatabase(UNeutralFileFormat* format, UListCtrl* list, USurveyDoc* job,
+                               nedit::DialogHost* host, nedit::ProgressSink* progress,
+                               const std::wstring& chkCode)
+    : Doc(format), ListCtrl(list), SurveyDoc(job), Host(host), Progress(progress),
+      ChkCode(chkCode.empty() ? L"*CHK" : chkCode) {
+    // Older field programs left a debugging file behind; an engine clears it away.
+    std::remove("DEBUG.DAT");
+    InitUnitsAndAngleModes();
+    DeleteTopoLines();
+}
+
+UNeditDatabase::~UNeditDatabase() {
+    ScaleFactor = 1.0;
+    DeleteList();
+    SaveBearingArray();
+    DeleteBearingArray();
+}
+
+bool UNeditDatabase::AbortRequested() const { return Progress != nullptr && Progress->AbortRequested(); }
+
+void UNeditDatabase::UpdateProgress(unsigned percent, const std::wstring& text) {
+    // Only changes go out, so that a run of millions of records does not flood the sink.
+    if (Progress == nullptr || (percent == LastPercent && text == LastProgressText)) return;
+    LastPercent = percent;
+    LastProgressText = text;
+    Progress->Update(static_cast<int>(percent), text);
+}
 
 int UNeditDatabase::GetAngleType() const {
-    switch (angle_unit_) {
+    switch (AngleUnit) {
         case L'D': case L'd': return 1;
         case L'G': case L'g': return 2;
         default: return 0;
     }
+}
+
+int UNeditDatabase::GetError() {
+    if (ErrorCode != 0) CError::Show(ErrorCode, Host);
+    return ErrorCode;
+}
+
+void UNeditDatabase::InitHeadList() {
+    Stations.clear();
+    StationsByName.Clear();
+    PendingStn.reset();
+    CurStn = nullptr;
+}
+
+void UNeditDatabase::SetMaxMin(const UWRect& extents) {
+    XMin = extents.GetMinX();
+    YMin = extents.GetMinY();
+    XMax = extents.GetMaxX();
+    YMax = extents.GetMaxY();
+    DocRect = extents;
+}
+
+int UNeditDatabase::Process() {
+    if (Doc != nullptr && !Doc->IsKeysInitialised()) {
+        nedit::AppMessageBox(Host, nedit::Translate(L"Record keys or fields have not been initialised."),
+                             nedit::mb::IconStop);
+        return 0;
+    }
+    CorrectDist = false;
+    if (!PrepareList() || !PrepareForwardNoBS()) return 0;
+    LoadBearingArray();
+    ProcessAverageMeas();
+    ProcessAverageAngle();
+    const int result = ProcessCoord(6, Output ? 1 : 0, 0, nullptr);
+    UseForAll = false;
+    SetMinMaxCoord();
+    return result == 0 ? 0 : 1;
+}
+
+void UNeditDatabase::ResetForRerun() {
+    DeleteList();
+    SaveBearingArray();
+    DeleteBearingArray();
+    DeleteTopoLines();
+    XMin = YMin = XMax = YMax = -1e12;
+    ErrorCode = 0;
+}
+
+void UNeditDatabase::Regenerate() {
+    ResetForRerun();
+    if (!PrepareList() || !PrepareForwardNoBS()) return;
+    LoadBearingArray();
+    if (!ProcessAverageMeas()) return;
+    ProcessAverageAngle();
+    ProcessCoord(6, 0, 0, nullptr);
+    SetMinMaxCoord();
+}
+
+void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRoutes) {
+    ResetForRerun();
+    PrepareList(rows);
+    PrepareForwardNoBS();
+    LoadBearingArray();
+    ProcessAverageMeas();
+    ProcessAverageAngle();
+    const int result = ProcessCoord(6, 1, 0, nullptr);
+    if (result == 0 || findRoutes) {
+        UseForAll = false;
+        SetMinMaxCoord();
+    }
+}
+
+std::vector<std::wstring> UNeditDatabase::ContentRows() const {
+    std::vector<std::wstring> rows;
+    if (ListCtrl == nullptr || Doc == nullptr) return rows;
+    rows.reserve(static_cast<std::size_t>(ListCtrl->GetItemCount()));
+    for (int row = 0; row < ListCtrl->GetItemCount(); ++row) {
+        std::wstring text = nedit::ToUpper(nedit::TrimView(std::wstring_view(ListCtrl->GetItemText(row)).substr(0, kMaxRowLength)));
+        if (IsContentType(Doc->GetRecordType(text))) rows.push_back(std::move(text));
+    }
+    return rows;
+}
+
+void UNeditDatabase::CreateContent() { ContentLines = ContentRows(); }
+
+bool UNeditDatabase::IsContentModified() const {
+    if (ListCtrl == nullptr || Doc == nullptr) return false;
+    const std::vector<std::wstring> present = ContentRows();
+    if (present.size() != ContentLines.size()) return true;
+    FieldMap stored_fields;
+    FieldMap present_fields;
+    for (std::size_t i = 0; i < present.size(); ++i) {
+        const int stored_type = Doc->GetRecordType(ContentLines[i]);
+        if (stored_type != Doc->GetRecordType(present[i])) return true;
+        const int stored_parsed = Doc->ProcessRecord(stored_type, ContentLines[i], stored_fields);
+        const int present_parsed = Doc->ProcessRecord(stored_type, present[i], present_fields);
+        if (stored_parsed != present_parsed) return true;
+        if (!stored_parsed) continue;
+        // A field only the present row has does not count; a changed case does not either.
+        for (const auto& [id, value] : stored_fields) {
+            const auto found = present_fields.find(id);
+            if (found == present_fields.end() || nedit::ToUpper(found->second) != nedit::ToUpper(value)) return true;
+        }
+    }
+    return false;
+}
+
+void UNeditDatabase::ReplaceRow(int row, const std::wstring& text) {
+    if (ListCtrl == nullptr) return;
+    ListCtrl->DeleteItem(row);
+    ListCtrl->AddRecord(row, text);
 }

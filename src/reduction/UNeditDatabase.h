@@ -1,53 +1,317 @@
 #pragma once
-// The reduction engine of one raw-data document. It reads the document's records, and will
-// reduce them to coordinates; this header grows with each stage of the run.
+// The reduction engine of one raw-data document. It reads the record list into stations,
+// targets and measurements, averages them, reduces them to East, North, Height, and keeps
+// the points, lines and arcs that result. Its operations live in the source files of the
+// stage they belong to: PrepareList.cpp, Averaging.cpp, CoordLookup.cpp, ProcessCoord.cpp,
+// the run in UNeditDatabase.cpp, the stores in codes/PointStores.cpp.
 
 #include <functional>
+#include <map>
+#include <memory>
 #include <string>
+#include <unordered_map>
+#include <vector>
+
+#include "codes/UNeditArc.h"
+#include "codes/UNeditLine.h"
+#include "codes/UNeditPt.h"
+#include "platform/geometry/UWCircle.h"
+#include "platform/geometry/UWRect.h"
+#include "records/UNeutralFileFormat.h"
+#include "reduction/CError.h"
+#include "reduction/NameIndex.h"
+#include "reduction/ObservationModel.h"
 
 class UListCtrl;
-class UNeutralFileFormat;
+class UNeditReport;
+class USurveyDoc;
 
 namespace nedit {
 class DialogHost;
 class ProgressSink;
 }  // namespace nedit
 
+/// Coordinates of a point given by an Xyz record.
+struct KnownCoord {
+    double East = 0.0;
+    double North = 0.0;
+    double Height = kNoHeight;
+};
+
+/// Instrument height of the last Insht record. It belongs to no engine: it starts at 0 and
+/// lives on from one run and one document to the next, as field software has always kept it.
+extern double CurInstHt;
+
 class UNeditDatabase {
 public:
-    /// The format service, the record list, the host that shows messages and the progress
-    /// sink may each be null; the engine then does without them.
-    UNeditDatabase(UNeutralFileFormat* format, UListCtrl* list, nedit::DialogHost* host,
-                   nedit::ProgressSink* progress = nullptr);
+    /// The engine of a document: its format service, record list, job and dialog host, each
+    /// of which may be null. `chkCode` is the check code, "*CHK" when empty.
+    UNeditDatabase(UNeutralFileFormat* format, UListCtrl* list, USurveyDoc* job,
+                   nedit::DialogHost* host, nedit::ProgressSink* progress = nullptr,
+                   const std::wstring& chkCode = L"");
     virtual ~UNeditDatabase();
     UNeditDatabase(const UNeditDatabase&) = delete;
     UNeditDatabase& operator=(const UNeditDatabase&) = delete;
+
+    // ---- The run ----------------------------------------------------------------------
+    /// A full run. 1 when it reached its end; 0 otherwise.
+    int Process();
+    /// A quiet re-run on the same engine, without report.
+    void Regenerate();
+    /// A re-run from given rows, with report output on.
+    void Generate(const std::vector<std::wstring>& rows, bool findRoutes);
+    /// Keeps a copy of the rows that count as content; IsContentModified compares with it.
+    void CreateContent();
+    bool IsContentModified() const;
+    /// The last error code; when it is not 0 its message is shown first.
+    int GetError();
+    void SetError(int code) { ErrorCode = code; }
+    /// The last error code, without showing its message.
+    int GetErrorCode() const { return ErrorCode; }
+    void UpdateProgress(unsigned percent, const std::wstring& text);
+
+    void SetOutput(bool output) { Output = output; }
+    bool GetOutput() const { return Output; }
+    void SetListCtrlPtr(UListCtrl* list) { ListCtrl = list; }
+    void SetReportPtr(UNeditReport* report) { Report = report; }
+    void SetFileName(const std::wstring& name) { FileName = name; }
+    const std::wstring& GetFileName() const { return FileName; }
+    void InitHeadList();
+    void SetMaxMin(const UWRect& extents);
+    /// The extents of the last run's points, or of the last good run.
+    UWRect GetDocExtents() const { return DocRect; }
 
     /// Reads a neutral text file (UTF-8 path) into the record list, clearing it first.
     /// Gives 1 when the list holds at least one row afterwards, else 0. Shows
     /// "Failed to open {1}." or "Neutral file header not found." when it cannot read.
     int LoadNeFile(const std::wstring& path);
-
     /// The angle type of the current angular unit letter: 1 decimal degrees, 2 gons, else 0.
     int GetAngleType() const;
-    wchar_t GetAngleUnit() const { return angle_unit_; }
-    void SetAngleUnit(wchar_t unit) { angle_unit_ = unit; }
-
     /// The pane, when there is one, learns the angle type of each unit record read.
-    void SetAngleTypeHandler(std::function<void(int)> handler) { angle_type_handler_ = std::move(handler); }
+    void SetAngleTypeHandler(std::function<void(int)> handler) { AngleTypeHandler = std::move(handler); }
 
-    /// A report is wanted from the next run.
-    bool GetOutput() const { return output_; }
-    void SetOutput(bool output) { output_ = output; }
+    // ---- List preparation -------------------------------------------------------------
+    int PrepareList();
+    int PrepareList(const std::vector<std::wstring>& rows);
+    int ProcessRecord(int type, const std::wstring& row, int recordNo);
+    /// The field from the record in hand, or its current value when absent or empty.
+    /// Valid until the next record is parsed.
+    const std::wstring& GetValue(int id) const;
+    int InsertStn(std::unique_ptr<STNSTRUCT> station, int makeCurrent);
+    int InsertSSMS(std::unique_ptr<SSSTRUCT> target, const MEASSTRUCT& measurement, int isBackSight);
+    int CopySS(const SSSTRUCT& from, SSSTRUCT& to) const;
+    int DummyStn(const STNSTRUCT& station) const;
+    int AddToFSptr(STNSTRUCT* station, SSSTRUCT* target);
+    int AddReverseFSptr(STNSTRUCT* station, SSSTRUCT* target);
+    int PrepareForwardNoBS();
+    int PrepareForwardWithBS();
+    int AddForwPtr(const std::wstring& name);
+    int AddNewStn(const std::wstring& name);
+    int DeleteForwPtr();
+    int DeleteList();
+    int GetListCount(int& stations, int& sideShots, int& forward) const;
+    /// The first station of that exact name that is not a point-only node, or null.
+    STNSTRUCT* searchSTN(const std::wstring& name) const;
+    /// All such stations, the names compared without regard to case.
+    int SearchSTN(const std::wstring& name, std::vector<STNSTRUCT*>& out) const;
+    void InitUnitsAndAngleModes();
+    double GetStnScaleFactor(const std::wstring& name) const;
 
-    UListCtrl* GetListCtrl() const { return list_; }
+    const std::vector<std::unique_ptr<STNSTRUCT>>& GetStations() const { return Stations; }
+    STNSTRUCT* GetCurStn() const { return CurStn; }
+    SSSTRUCT* GetCurrentSS() const { return CurSS; }
+    wchar_t GetHMode() const { return HMode; }
+    wchar_t GetVMode() const { return VMode; }
+    wchar_t GetAngleUnit() const { return AngleUnit; }
+    wchar_t GetLengthUnit() const { return LengthUnit; }
+    UListCtrl* GetListCtrl() const { return ListCtrl; }
+    USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
+    void SetCurHMode(wchar_t mode) { HMode = mode; }
+    void SetTravFlag(int flag) { TravFlag = flag; }
+    const std::map<std::wstring, KnownCoord>& GetKnownCoords() const { return KnownCoordMap; }
+    const std::wstring& GetDateText() const { return DateText; }
+
+    // ---- Averaging --------------------------------------------------------------------
+    int ProcessAverageMeas();
+    int ProcessAverageAngle();
+    int FindAverageMeas(const MeasurementList& measurements, double& hAng, double& vAng,
+                        double& sDist, double& htTarget) const;
+    static int CheckFace(double zenith);
+    static double chgface(double hAng);
+    static double chgVaface(double zenith);
+    static double AngleDiff(double from, double to);
+    static double chgDeg(double dddmmss);
+
+    // ---- Coordinate lookup and bearing store ------------------------------------------
+    int findCoord(const std::wstring& name, double& e, double& n, double& z, std::wstring& code,
+                  int fix, bool askUser);
+    int getCoord(const std::wstring& name, double* e, double* n, double* z, std::wstring& code,
+                 int clear, bool showDialog);
+    int setCoord(const std::wstring& name, double e, double n, double z, const std::wstring& code,
+                 int flags, int fix, int ptFlag);
+    int GetCoordFromStnList(const std::wstring& name, double& e, double& n, double& z, std::wstring& code) const;
+    /// 1 when the job has the point and it loads, with its values and code.
+    int GetCoordFromSvyDoc(const std::wstring& name, double& e, double& n, double& z, std::wstring& code) const;
+    /// The job has a point of that name (whether or not it loads).
+    bool JobHasPoint(const std::wstring& name) const;
+    /// Coordinates are shown Easting first: the job's setting, and so without a job.
+    bool CoordsOrderXY() const;
+    int GetPointFromPtList(const std::wstring& name, double& e, double& n, double& z, std::wstring& code,
+                           unsigned mode) const;
+    int FindXYZ(const std::wstring& name, double& e, double& n, double& z);
+    int FindRecord(int type, const std::wstring& name);
+    std::wstring FormatXYZRecord(const std::wstring& name, double e, double n, double z) const;
+    std::wstring FormatBKBRecord(const std::wstring& name, double reading, double bearing) const;
+    double GetBearingFromArray(std::wstring from, std::wstring to) const;
+    int GetBearingArray(const std::wstring& from, const std::wstring& to, int& direction) const;
+    int InsertBearingArray(std::wstring from, std::wstring to, double bearing);
+    int LoadBearingArray();
+    int SaveBearingArray() const;
+    int DeleteBearingArray();
+    /// The bearing store's file: the neutral file's name with ".$BR" for its extension.
+    std::wstring BearingFileName() const;
+    const std::vector<ULINEBEAR_STRUCT>& GetLineBearings() const { return LineBearings; }
+
+    // ---- Reduction --------------------------------------------------------------------
+    int ProcessCoord(int passes, int report, int fixedOnly, std::vector<std::wstring>* records);
+    static void geo_coord(double e, double n, double bearing, double dist, double* eOut, double* nOut);
+    static void ApplyOffsets(double& e, double& n, double& z, double along, double right, double up,
+                             double bearing);
+
+    // ---- Point, line and arc stores ---------------------------------------------------
+    unsigned SavePoint(const std::wstring& name, double x, double y, double z, std::wstring code,
+                       int ptFlag, unsigned flags, int derived);
+    unsigned SaveTravPoint(const std::wstring& name, double x, double y, double z,
+                           const std::wstring& code, int additionFlag);
+    int SaveLine(unsigned from, unsigned to, int stationLine);
+    int SaveArc(const UNeditPt& first, const UNeditPt& second, const UNeditPt& third, ArcType type);
+    void DeleteTopoLines();
+    void SetMinMaxCoord();
+
+    int GetPointIdx(const std::wstring& name) const;
+    int GetAddPointIdx(const std::wstring& name) const;
+    int GetTravPointIdx(const std::wstring& name) const;
+    UNeditPt* SearchPt(const std::wstring& name);
+    UNeditPt* GetLastPoint();
+    bool GetPtNameAt(int index, std::wstring& name) const;
+    int GetLineIdx(const std::wstring& a, const std::wstring& b) const;
+    int Check_In_LnList(const std::wstring& name) const;
+    int SearchArc(const std::wstring& a, const std::wstring& b, const std::wstring& third, ArcType type) const;
+
+    const std::vector<UNeditPt>& GetPointList() const { return PointList; }
+    const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList; }
+    const std::vector<UNeditLine>& GetLineList() const { return LineList; }
+    const std::vector<UNeditArc>& GetArcList() const { return ArcList; }
+    const std::vector<UWCircle>& GetCircleList() const { return CircleList; }
+
+    /// The messages of the coordinate dialogs go to this host; null answers by default.
+    nedit::DialogHost* GetDialogHost() const { return Host; }
 
 private:
-    UNeutralFileFormat* format_;
-    UListCtrl* list_;
-    nedit::DialogHost* host_;
-    nedit::ProgressSink* progress_;
-    std::function<void(int)> angle_type_handler_;
-    wchar_t angle_unit_ = L'S';
-    bool output_ = false;
+    bool AbortRequested() const;
+    void ResetForRerun();
+    void AppendStation(std::unique_ptr<STNSTRUCT> station);
+    void ResetPassValues();
+    int PrepareRows(const std::vector<std::wstring>& rows);
+    /// A field of the record in hand only. Names, codes, and the fields whose emptiness a
+    /// record type gives a meaning to are read so: they do not run down from earlier records.
+    const std::wstring& OwnValue(int id) const;
+    void ProcessPtRecord();
+    void ProcessStnRecord();
+    void ProcessBkbRecord();
+    void ProcessObservation(int type, int recordNo);
+    void ApplyDistanceCorrection(MEASSTRUCT& measurement) const;
+    void MoveStnPtNames(const void* from, const void* to);
+    int FindCoordinateRow(const std::wstring& name, bool coordinates, int type, double* e, double* n, double* z);
+    void ReplaceRow(int row, const std::wstring& text);
+    /// The first node of that exact name, in list order; the others follow by NextSameName.
+    STNSTRUCT* FirstNamed(const std::wstring& name) const;
+    std::vector<STNSTRUCT*> OccupiedStations(const std::wstring& name, const STNSTRUCT* observer) const;
+    void RebuildPointIndex();
+    void RebuildLineIndex();
+    std::vector<std::wstring> ContentRows() const;
+    // Reduction of one station, and of one target with its printing (ProcessCoord.cpp).
+    struct StationWork;
+    /// Results of PositionStation.
+    enum { kPositionFound, kPositionNotFound, kStationLeftOut, kPositionFailed };
+    int PositionStation(STNSTRUCT& station, StationWork& work, int report, int fixedOnly);
+    int OrientByCoordinates(STNSTRUCT& station, StationWork& work);
+    void AskBackStation(const STNSTRUCT& station, StationWork& work, const UWPoint& here);
+    void ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target, const StationWork& work,
+                      double& e, double& n, double& z) const;
+    int ForwardPass(STNSTRUCT& station, StationWork& work, int report);
+    int SideShotPass(STNSTRUCT& station, StationWork& work, int report);
+    bool IsSelfObservation(const STNSTRUCT& station, const SSSTRUCT& target) const;
+
+    // Collaborators.
+    UNeutralFileFormat* Doc;
+    UNeditReport* Report = nullptr;
+    UListCtrl* ListCtrl;
+    USurveyDoc* SurveyDoc;
+    nedit::DialogHost* Host;
+    nedit::ProgressSink* Progress;
+    CError ErrorSink;
+    std::function<void(int)> AngleTypeHandler;
+    std::wstring FileName;
+
+    // Running values of a pass.
+    wchar_t HMode = L'A';
+    wchar_t VMode = L'Z';
+    wchar_t AngleUnit = L'S';
+    wchar_t LengthUnit = L'M';
+    int TravFlag = 0;
+    FieldMap Fields;
+    double ScaleFactor = 1.0;
+    double PrismConst = 0.0;
+    double FirstSwing = 0.0;
+    double CurSwing = 0.0;
+    double HCorr = 0.0;
+    double VCorr = 0.0;
+    std::wstring DateText;
+    double Refraction = 0.0;
+    double EarthRadius = 0.0;
+    bool CorrectDist = false;
+    std::wstring ChkShotCode;
+    std::wstring ChkCode;
+    bool Output = false;
+    int ErrorCode = 0;
+    std::vector<std::wstring> ContentLines;
+
+    // The observation model: stations in list order, with a look-up by exact name.
+    std::vector<std::unique_ptr<STNSTRUCT>> Stations;
+    // The first node of each name, by its place in Stations; the others of that name follow
+    // by NextSameName.
+    NameIndex StationsByName{[this](std::size_t i) -> const std::wstring& { return Stations[i]->StnName; }};
+    STNSTRUCT* CurStn = nullptr;          // the station being filled, or the last one of a pass
+    std::unique_ptr<STNSTRUCT> PendingStn; // owns the station being filled until it joins the list
+    SSSTRUCT* CurSS = nullptr;
+    std::unique_ptr<std::vector<std::wstring>> CurPtNames;
+    std::map<const void*, std::vector<std::wstring>> StnPtNames;
+    std::unique_ptr<std::vector<SSCheck>> CurChkList;
+    std::map<const void*, std::vector<SSCheck>> ChkShotMap;
+    std::map<std::wstring, KnownCoord> KnownCoordMap;
+    std::map<std::wstring, double> StnScaleMap;
+
+    // Coordinate sources and the bearing store.
+    std::map<std::wstring, bool> DbCoordNames;
+    std::map<std::wstring, bool> LocalCoordNames;
+    bool UseForAll = false;
+    std::vector<ULINEBEAR_STRUCT> LineBearings;
+    std::unordered_map<std::wstring, std::size_t> BearingIndex;  // "from\x1fto" as stored
+
+    // Stores of reduced geometry, with look-ups by name.
+    std::vector<UNeditPt> PointList;
+    NameIndex PointIndex{[this](std::size_t i) -> const std::wstring& { return PointList[i].GetID(); }};
+    std::vector<UNeditPt> AddPtList;
+    NameIndex AddPtIndex{[this](std::size_t i) -> const std::wstring& { return AddPtList[i].GetID(); }};
+    std::vector<UNeditPt> TravPtList;
+    NameIndex TravPtIndex{[this](std::size_t i) -> const std::wstring& { return TravPtList[i].GetID(); }};
+    std::vector<UNeditLine> LineList;
+    std::unordered_map<std::wstring, std::size_t> LineIndex;
+    std::vector<UNeditArc> ArcList;
+    std::vector<UWCircle> CircleList;
+    double XMin = -1e12, YMin = -1e12, XMax = -1e12, YMax = -1e12;
+    unsigned LastPercent = 1000;  // none reported yet
+    std::wstring LastProgressText;
+    UWRect DocRect{0.0, 0.0, 100.0, 100.0};
 };

@@ -37,11 +37,76 @@ check rows-no-header 2 /dev/null "sxnedit: Neutral file header not found." -- "$
 check rows-empty 2 /dev/null "sxnedit: $work/empty.neu holds no records" -- "$sxnedit" rows "$work/empty.neu"
 check rows-no-file 64 /dev/null "" -- "$sxnedit" rows
 check unknown-command 64 /dev/null "sxnedit: unknown command 'frobnicate' (see sxnedit --help)" -- "$sxnedit" frobnicate
+# Jobs: a new job, an import with awkward names and a repeated name, listings, the export,
+# and a second import of the export that must give back the same points.
+job="$work/survey.job"
+# expected FILE: the expected text with @WORK@ standing for the temporary folder.
+expected() { sed "s|@WORK@|$work|g" "$here/expected/$1" >"$work/expected-$1" && echo "$work/expected-$1"; }
+check job-new 0 "$(expected job-new.txt)" "" -- "$sxnedit" job new "$job"
+printf 'name,east,north,height,code\r\nP1,100.5,200.25,10,FNC01\r\n"Zürich, ""A""",1,2,,TREE\r\nP1,101,201,,KB\r\nCTRL,0.1,0.2,-3.5,\r\n' >"$work/points.csv"
+check job-import 0 "$(expected job-import.txt)" \
+    "sxnedit: $work/points.csv line 4: point P1 repeats line 2; the later row is used" -- \
+    "$sxnedit" job import-points "$job" "$work/points.csv"
+check job-points 0 "$here/expected/job-points.txt" "" -- "$sxnedit" job points "$job"
+check job-points-json 0 "$here/expected/job-points.json" "" -- "$sxnedit" job points "$job" --json
+check job-export 0 "" "" -- "$sxnedit" job export-points "$job" "$work/export.csv"
+check job-export-text 0 "$here/expected/job-export.csv" "" -- cat "$work/export.csv"
+check job-new-again 0 "" "" -- "$sxnedit" job new "$work/copy.job"
+check job-reimport 0 "" "" -- "$sxnedit" job import-points "$work/copy.job" "$work/export.csv"
+check job-roundtrip 0 "$here/expected/job-points.json" "" -- "$sxnedit" job points "$work/copy.job" --json
+check job-info 0 "$(expected job-info.txt)" "" -- "$sxnedit" job info "$job"
+printf 'P7,1,2,3\nP8,1,x,2,KB\n' >"$work/bad.csv"
+check job-import-text-number 2 /dev/null \
+    "sxnedit: $work/bad.csv line 2: the north value \"x\" is not a number; nothing was imported" -- \
+    "$sxnedit" job import-points "$job" "$work/bad.csv"
+printf 'P7,1,2\n' >"$work/short.csv"
+check job-import-missing-column 2 /dev/null \
+    "sxnedit: $work/short.csv line 1: 3 columns where name,east,north,height,code are expected; nothing was imported" -- \
+    "$sxnedit" job import-points "$job" "$work/short.csv"
+check job-import-nothing 0 "$here/expected/job-points.txt" "" -- "$sxnedit" job points "$job"
+check job-import-no-file 2 /dev/null "sxnedit: cannot read $work/none.csv" -- \
+    "$sxnedit" job import-points "$job" "$work/none.csv"
+check job-missing-folder 1 /dev/null \
+    "sxnedit: Cannot create the job $work/gone/x.job: the folder $work/gone does not exist." -- \
+    "$sxnedit" job new "$work/gone/x.job"
+check job-not-a-job 1 /dev/null "sxnedit: $work/points.csv is not a job file." -- \
+    "$sxnedit" job info "$work/points.csv"
+check job-exists 1 /dev/null \
+    "sxnedit: Cannot create the job $job: a file of that name exists." -- "$sxnedit" job new "$job"
+check job-usage 64 /dev/null "" -- "$sxnedit" job points
 printf 'sxnedit %s\n' "$("$sxnedit" --version | cut -d' ' -f2)" >"$work/version"
 check version 0 "$work/version" "" -- "$sxnedit" --version
 "$sxnedit" --help >"$work/help"
 grep -q '^Usage: sxnedit COMMAND' "$work/help" && grep -q 'rows FILE.neu' "$work/help" &&
     passed=$((passed + 1)) || { echo "FAIL help: usage text incomplete"; failed=$((failed + 1)); }
+
+# A closed traverse observed exactly from known coordinates: every reduced point lies within
+# 0.001 of the coordinates it was generated from.
+"$sxnedit" reduce "$data/closed_traverse.neu" --json >"$work/traverse.json" 2>"$work/err"
+status=$?
+far=$(awk -F'"' '
+    NR == FNR { split($0, t, ","); e[t[1]] = t[2]; n[t[1]] = t[3]; h[t[1]] = t[4]; next }
+    /"id":/ {
+        id = $4
+        match($0, /"e": [-0-9.e]+/); pe = substr($0, RSTART + 5, RLENGTH - 5)
+        match($0, /"n": [-0-9.e]+/); pn = substr($0, RSTART + 5, RLENGTH - 5)
+        match($0, /"h": [-0-9.e]+/); ph = substr($0, RSTART + 5, RLENGTH - 5)
+        seen[id] = 1
+        d = (pe - e[id]) ^ 2 + (pn - n[id]) ^ 2
+        if (!(id in e) || d > 1e-6 || (ph - h[id]) ^ 2 > 1e-6) print id
+    }
+    END { for (id in e) if (!(id in seen)) print "missing " id }
+' "$data/closed_traverse_truth.csv" "$work/traverse.json")
+if [ "$status" -eq 0 ] && [ -z "$far" ] && grep -q '"error": 0' "$work/traverse.json"; then
+    passed=$((passed + 1))
+else
+    echo "FAIL reduce-closed-traverse: status $status, points off: $far"; failed=$((failed + 1))
+fi
+
+printf '#VERSION-1.0 NEUTRAL FILE\nSTN ID=K\nSS ID=Q,HA=0,VA=90,SD=5,HT=0\n' >"$work/unknown.neu"
+check reduce-unknown-station 0 "$here/expected/unknown_station.json" "" -- "$sxnedit" reduce "$work/unknown.neu" --json
+check reduce-missing 2 /dev/null "sxnedit: Failed to open $work/none.neu." -- "$sxnedit" reduce "$work/none.neu"
+check reduce-no-file 64 /dev/null "" -- "$sxnedit" reduce --json
 
 echo "cli: $passed passed, $failed failed"
 [ "$failed" -eq 0 ]

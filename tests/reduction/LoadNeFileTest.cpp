@@ -37,7 +37,7 @@ protected:
 
     UListCtrl list{&format};
     nedit::HeadlessDialogHost host;
-    UNeditDatabase engine{&format, &list, &host};
+    UNeditDatabase engine{&format, &list, nullptr, &host};
 };
 
 const std::wstring kHeader = L"#VERSION-1.0 NEUTRAL FILE";
@@ -115,7 +115,7 @@ TEST_F(LoadNeFile, FilesThatCannotBeReadSayWhy) {
     EXPECT_EQ(LoadBytes("\n   \n\t\n"), 0);
     EXPECT_EQ(Messages().size(), 4u);
 
-    UNeditDatabase without_list(&format, nullptr, &host);
+    UNeditDatabase without_list(&format, nullptr, nullptr, &host);
     EXPECT_EQ(without_list.LoadNeFile(L"whatever.neu"), 0);
     EXPECT_FALSE(without_list.GetOutput());
 }

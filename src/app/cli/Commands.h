@@ -13,3 +13,5 @@ constexpr int Usage = 64;      // the command line itself is wrong
 }  // namespace exit_status
 
 int RunRows(const std::vector<std::string>& args);
+int RunReduce(const std::vector<std::string>& args);
+int RunJob(const std::vector<std::string>& args);

@@ -1,18 +1,121 @@
 #include "ConsoleDialogHost.h"
 
-#include <cstdio>
+#include <iostream>
 
+#include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
+#include "reduction/UBKBCoordDlg.h"
+#include "reduction/UCoordEntryDlg.h"
+
+namespace {
+
+struct Button {
+    const char* key;
+    const char* label;
+    int answer;
+};
+
+// The buttons of a message box, in their order.
+std::vector<Button> ButtonsOf(unsigned flags) {
+    using namespace nedit::mb;
+    switch (flags & ButtonsMask) {
+        case OkCancel: return {{"o", "OK", IdOk}, {"c", "Cancel", IdCancel}};
+        case AbortRetryIgnore: return {{"a", "Abort", IdAbort}, {"r", "Retry", IdRetry}, {"i", "Ignore", IdIgnore}};
+        case YesNoCancel: return {{"y", "Yes", IdYes}, {"n", "No", IdNo}, {"c", "Cancel", IdCancel}};
+        case YesNo: return {{"y", "Yes", IdYes}, {"n", "No", IdNo}};
+        case RetryCancel: return {{"r", "Retry", IdRetry}, {"c", "Cancel", IdCancel}};
+        default: return {{"o", "OK", IdOk}};
+    }
+}
+
+double AskNumber(const std::string& answer, double fallback) {
+    return answer.empty() ? fallback : nedit::TextToDouble(nedit::FromUtf8(answer));
+}
+
+}  // namespace
 
 int ConsoleDialogHost::ShowMessage(const std::wstring& text, unsigned flags, unsigned /*help*/) {
-    ++messages_shown_;
-    std::fprintf(stderr, "sxnedit: %s\n", nedit::ToUtf8(text).c_str());
+    MessagesShown.push_back(text);
+    if (Interactive) return AskMessage(text, flags);
+    if (Echo) std::fprintf(stderr, "sxnedit: %s\n", nedit::ToUtf8(text).c_str());
     return nedit::mb::DefaultAnswer(flags);
 }
 
 int ConsoleDialogHost::RunDialog(nedit::UDialogLogic& dialog) {
     dialog.OnInitDialog();
+    if (auto* coordinates = dynamic_cast<UCoordEntryDlg*>(&dialog)) {
+        if (Interactive) return AskCoordinates(*coordinates);
+        coordinates->SetApplyToAll(true);
+    } else if (auto* back = dynamic_cast<UBKBCoordDlg*>(&dialog); back != nullptr && Interactive) {
+        return AskBackStation(*back);
+    }
     if (dialog.OnOK()) return nedit::mb::IdOk;
     dialog.OnCancel();
     return nedit::mb::IdCancel;
+}
+
+std::string ConsoleDialogHost::ReadAnswer(const std::string& prompt) {
+    std::fprintf(stderr, "%s", prompt.c_str());
+    std::fflush(stderr);
+    std::string line;
+    if (!std::getline(std::cin, line)) return {};
+    return nedit::ToUtf8(nedit::Trim(nedit::FromUtf8(line)));
+}
+
+int ConsoleDialogHost::AskMessage(const std::wstring& text, unsigned flags) {
+    const std::vector<Button> buttons = ButtonsOf(flags);
+    std::fprintf(stderr, "%s\n", nedit::ToUtf8(text).c_str());
+    if (buttons.size() == 1) return buttons[0].answer;
+    std::string prompt = "[";
+    for (const Button& button : buttons) prompt += std::string(prompt.size() > 1 ? "/" : "") + button.key + " " + button.label;
+    prompt += "] ";
+    const std::string answer = ReadAnswer(prompt);
+    for (const Button& button : buttons) {
+        if (!answer.empty() && answer[0] == button.key[0]) return button.answer;
+    }
+    return nedit::mb::DefaultAnswer(flags);
+}
+
+int ConsoleDialogHost::AskCoordinates(UCoordEntryDlg& dialog) {
+    using Source = UCoordEntryDlg::Source;
+    std::fprintf(stderr, "Control Point Coordinate: %s\nSelect the desired source or enter the point coordinates.\n",
+                 nedit::ToUtf8(dialog.GetName()).c_str());
+    const std::pair<Source, const char*> sources[] = {{Source::Database, "d  Database Coordinate"},
+                                                      {Source::Field, "f  Field Coordinate"}};
+    for (const auto& [source, label] : sources) {
+        if (!dialog.IsOffered(source)) continue;
+        const UCoordEntryDlg::Row& row = dialog.RowOf(source);
+        std::fprintf(stderr, "  %s  E %.3f  N %.3f  H %.3f\n", label, row.East, row.North, row.Height);
+    }
+    std::fprintf(stderr, "  e  Enter Coordinate\n  c  Cancel\n");
+    const std::string choice = ReadAnswer("Source [" + std::string(dialog.GetSelectedSource() == Source::Database ? "d"
+                                                                  : dialog.GetSelectedSource() == Source::Field ? "f"
+                                                                                                               : "e") + "]: ");
+    if (choice == "c") return nedit::mb::IdCancel;
+    if (choice == "d") dialog.SelectSource(Source::Database);
+    if (choice == "f") dialog.SelectSource(Source::Field);
+    if (choice == "e") dialog.SelectSource(Source::Enter);
+    if (dialog.IsEntryEditable()) {
+        const UCoordEntryDlg::Row& entered = dialog.RowOf(Source::Enter);
+        const double e = AskNumber(ReadAnswer("Easting: "), entered.East);
+        const double n = AskNumber(ReadAnswer("Northing: "), entered.North);
+        const double h = AskNumber(ReadAnswer("Height (blank for none): "), entered.Height);
+        dialog.SetEntered(e, n, h, entered.Code);
+    }
+    dialog.SetApplyToAll(ReadAnswer("Apply to All? [y/N] ") == "y");
+    return dialog.OnOK() ? nedit::mb::IdOk : nedit::mb::IdCancel;
+}
+
+int ConsoleDialogHost::AskBackStation(UBKBCoordDlg& dialog) {
+    std::fprintf(stderr, "Back Bearing: %s\n", nedit::ToUtf8(dialog.GetPointName()).c_str());
+    const std::string bearing = ReadAnswer("Bearing in degrees (blank to give coordinates): ");
+    if (!bearing.empty()) {
+        dialog.ApplyBearing = true;
+        dialog.Bearing = AskNumber(bearing, 0.0);
+        return nedit::mb::IdOk;
+    }
+    dialog.East = AskNumber(ReadAnswer("Easting: "), 0.0);
+    dialog.North = AskNumber(ReadAnswer("Northing: "), 0.0);
+    dialog.Height = AskNumber(ReadAnswer("Height: "), 0.0);
+    return nedit::mb::IdOk;
 }

@@ -1,16 +1,39 @@
 #pragma once
-// The command line's dialog host: messages go to standard error, and every question is
-// answered with its default button, since nobody is there to press one.
+// The command line's dialog host. Unattended, it answers as "Apply to All" would: a point's
+// coordinates come from the job if it offers them, else from the field records, else the
+// entered values; every message box takes its default button. With `interactive` it asks
+// on the terminal instead. Every message shown is kept, in order, for the JSON output.
+
+#include <cstdio>
+#include <string>
+#include <vector>
 
 #include "platform/messages/DialogHost.h"
 
+class UBKBCoordDlg;
+class UCoordEntryDlg;
+
 class ConsoleDialogHost : public nedit::DialogHost {
 public:
+    /// `echo` prints each message on standard error as it is shown.
+    explicit ConsoleDialogHost(bool interactive = false, bool echo = true)
+        : Interactive(interactive), Echo(echo) {}
+
     int ShowMessage(const std::wstring& text, unsigned flags, unsigned help) override;
     int RunDialog(nedit::UDialogLogic& dialog) override;
 
-    int MessagesShown() const { return messages_shown_; }
+    void SetInteractive(bool interactive) { Interactive = interactive; }
+    void SetEcho(bool echo) { Echo = echo; }
+    const std::vector<std::wstring>& Messages() const { return MessagesShown; }
 
 private:
-    int messages_shown_ = 0;
+    int AskMessage(const std::wstring& text, unsigned flags);
+    int AskCoordinates(UCoordEntryDlg& dialog);
+    int AskBackStation(UBKBCoordDlg& dialog);
+    /// A line from the terminal; empty at the end of input.
+    std::string ReadAnswer(const std::string& prompt);
+
+    bool Interactive;
+    bool Echo;
+    std::vector<std::wstring> MessagesShown;
 };

@@ -13,8 +13,8 @@ int RunRows(const std::vector<std::string>& args) {
     }
     RecordSession session;
     if (!session.LoadDefinition()) return exit_status::Failed;
-    if (!session.engine.LoadNeFile(nedit::FromUtf8(args[0]))) {
-        if (session.host.MessagesShown() == 0) {
+    if (!session.StartEngine().LoadNeFile(nedit::FromUtf8(args[0]))) {
+        if (session.host.Messages().empty()) {
             std::fprintf(stderr, "sxnedit: %s holds no records\n", args[0].c_str());
         }
         return exit_status::Unreadable;

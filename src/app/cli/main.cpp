@@ -20,12 +20,30 @@ const char* const kUsage =
     "  rows FILE.neu   print the records of a neutral file, one per line, as the\n"
     "                  record list holds them (upper case, laid out, unknown keys\n"
     "                  as comments)\n"
+    "  job new JOB     make a new job file, with the default survey codes\n"
+    "  job points JOB [--json]\n"
+    "                  list the job's points; --json gives objects with id, e, n,\n"
+    "                  h (null: no height) and code\n"
+    "  job import-points JOB FILE.csv\n"
+    "                  add or update points from name,east,north,height,code rows\n"
+    "                  (empty height: none; a later row of the same name wins)\n"
+    "  job export-points JOB FILE.csv\n"
+    "                  write the job's points as such rows\n"
+    "  job info JOB    the job's settings and what it holds\n"
+    "  reduce FILE.neu [--job JOB] [--json] [--points OUT.csv] [--interactive]\n"
+    "                  reduce the observations to East, North, Height and print the\n"
+    "                  points; --job takes known points from a job, --json prints\n"
+    "                  points, lines, arcs, circles, the error code and the messages,\n"
+    "                  --points writes id,east,north,height,code rows. Questions are\n"
+    "                  answered as \"Apply to All\" would (job, else field records,\n"
+    "                  else entered values) unless --interactive asks on the terminal\n"
     "\n"
     "Options:\n"
     "  -h, --help      show this help and exit\n"
     "  --version       show the version and exit\n"
     "\n"
-    "Exit status: 0 done, 1 failed, 2 an input file could not be read,\n"
+    "Exit status: 0 done, 1 failed (for reduce: the run did not reach its end),\n"
+    "2 an input file could not be read, "
     "64 the command line is wrong.\n"
     "Environment: SXNEDIT_DATA_DIR names the directory of the record definition.\n";
 
@@ -45,6 +63,8 @@ int Dispatch(const std::vector<std::string>& words) {
     }
     const std::vector<std::string> args(words.begin() + 1, words.end());
     if (command == "rows") return RunRows(args);
+    if (command == "job") return RunJob(args);
+    if (command == "reduce") return RunReduce(args);
     std::fprintf(stderr, "sxnedit: unknown command '%s' (see sxnedit --help)\n", command.c_str());
     return exit_status::Usage;
 }

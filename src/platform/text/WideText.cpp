@@ -150,6 +150,18 @@ std::wstring ToLower(std::wstring_view text) {
     return MapCase(text, towlower_l, [](wchar_t c) { return (c >= L'A' && c <= L'Z') ? static_cast<wchar_t>(c + 32) : c; });
 }
 
+bool EqualsIgnoreCase(std::wstring_view a, std::wstring_view b) {
+    if (a.size() != b.size()) return false;
+    const locale_t locale = CaseLocale();
+    for (std::size_t i = 0; i < a.size(); ++i) {
+        if (a[i] == b[i]) continue;
+        const wint_t upper_a = locale ? towupper_l(static_cast<wint_t>(a[i]), locale) : static_cast<wint_t>(a[i]);
+        const wint_t upper_b = locale ? towupper_l(static_cast<wint_t>(b[i]), locale) : static_cast<wint_t>(b[i]);
+        if (upper_a != upper_b) return false;
+    }
+    return true;
+}
+
 bool IsBlank(wchar_t c) {
     return c == L' ' || c == L'\t' || c == L'\r' || c == L'\n' || c == L'\v' || c == L'\f';
 }

@@ -26,6 +26,9 @@ std::string ToUtf8(std::wstring_view text);
 std::wstring ToUpper(std::wstring_view text);
 std::wstring ToLower(std::wstring_view text);
 
+/// The two texts are equal when both are upper-cased as ToUpper does; nothing is allocated.
+bool EqualsIgnoreCase(std::wstring_view a, std::wstring_view b);
+
 /// True for the blanks that trimming removes: space, tab, CR, LF, VT, FF.
 bool IsBlank(wchar_t c);
 

@@ -1,0 +1,56 @@
+#include "PointOutput.h"
+
+#include <cstdio>
+#include <fstream>
+
+#include "Json.h"
+#include "platform/job/Csv.h"
+#include "platform/text/Format.h"
+#include "platform/text/NumberText.h"
+#include "platform/text/WideText.h"
+
+std::string PointsTable(const std::vector<PointRow>& points, int decimals) {
+    std::string out = nedit::ToUtf8(nedit::Format(L"%-12s %14s %14s %10s  %s\n", L"Name", L"East", L"North",
+                                                  L"Height", L"Code"));
+    for (const PointRow& point : points) {
+        const std::wstring height = point.hasHeight ? nedit::Format(L"%.*f", decimals, point.height) : L"-";
+        out += nedit::ToUtf8(nedit::TrimRight(nedit::Format(L"%-12s %14.*f %14.*f %10s  %s", point.name, decimals,
+                                                            point.east, decimals, point.north, height, point.code)));
+        out += '\n';
+    }
+    return out;
+}
+
+std::string PointsJson(const std::vector<PointRow>& points, int indent) {
+    if (points.empty()) return "[]";
+    const std::string margin(static_cast<std::size_t>(indent), ' ');
+    std::string out = "[";
+    const char* separator = "\n";
+    for (const PointRow& point : points) {
+        out += separator + margin + "  {\"id\": " + json::Quote(point.name) + ", \"e\": " + json::Number(point.east) +
+               ", \"n\": " + json::Number(point.north) +
+               ", \"h\": " + (point.hasHeight ? json::Number(point.height) : "null") +
+               ", \"code\": " + json::Quote(point.code) + "}";
+        separator = ",\n";
+    }
+    return out + "\n" + margin + "]";
+}
+
+std::string PointsCsv(const std::vector<PointRow>& points) {
+    std::string out = "name,east,north,height,code\n";
+    for (const PointRow& point : points) {
+        out += nedit::CsvField(nedit::ToUtf8(point.name)) + "," + nedit::ToUtf8(nedit::DoubleToText(point.east)) + "," +
+               nedit::ToUtf8(nedit::DoubleToText(point.north)) + "," +
+               (point.hasHeight ? nedit::ToUtf8(nedit::DoubleToText(point.height)) : "") + "," +
+               nedit::CsvField(nedit::ToUtf8(point.code)) + "\n";
+    }
+    return out;
+}
+
+bool WritePointsCsv(const std::string& path, const std::vector<PointRow>& points) {
+    std::ofstream file(path, std::ios::binary | std::ios::trunc);
+    file << PointsCsv(points);
+    file.close();
+    if (!file) std::fprintf(stderr, "sxnedit: cannot write %s\n", path.c_str());
+    return static_cast<bool>(file);
+}

@@ -1,0 +1,289 @@
+// The walk down the station list that positions and orients each set-up and reduces its
+// forward observations and side shots to East, North, Height.
+
+#include <cmath>
+
+#include "document/UListCtrl.h"
+#include "platform/geometry/Tolerance.h"
+#include "platform/geometry/UAngle.h"
+#include "platform/geometry/UWLine.h"
+#include "platform/geometry/UWVector.h"
+#include "platform/text/WideText.h"
+#include "records/RecordTypes.h"
+#include "reduction/UBKBCoordDlg.h"
+#include "reduction/UCoordEntryDlg.h"
+#include "reduction/UNeditDatabase.h"
+
+namespace {
+
+constexpr const wchar_t* kGeneratingGraphics = L"Generating Graphics";
+constexpr double kPi = 3.141592653589793;
+
+}  // namespace
+
+/// What lives while one station is worked.
+struct UNeditDatabase::StationWork {
+    double StnE = 0.0;
+    double StnN = 0.0;
+    double StnZ = kNoHeight;
+    std::wstring StnCodeOut;
+    double BackBearing = 0.0;
+    double BsReading = 0.0;
+    std::size_t StepsDone = 0;
+    std::size_t Steps = 1;
+};
+
+void UNeditDatabase::geo_coord(double e, double n, double bearing, double dist, double* eOut, double* nOut) {
+    const double b = bearing * kRadiansPerDegree;
+    *eOut = std::sin(b) * dist + e;
+    *nOut = std::cos(b) * dist + n;
+}
+
+void UNeditDatabase::ApplyOffsets(double& e, double& n, double& z, double along, double right, double up,
+                                  double bearing) {
+    const UWVector ahead(UWBrgDst(bearing, along));
+    const UWVector aside(UWBrgDst(bearing + 90.0, right));
+    e += ahead.x + aside.x;
+    n += ahead.y + aside.y;
+    z += up;
+}
+
+bool UNeditDatabase::IsSelfObservation(const STNSTRUCT& station, const SSSTRUCT& target) const {
+    return nedit::EqualsIgnoreCase(target.SSName, station.StnName);
+}
+
+void UNeditDatabase::ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target, const StationWork& work,
+                                  double& e, double& n, double& z) const {
+    const double zenith = target.VAng * kPi / 180.0;
+    const double horizontal = std::sin(zenith) * target.SDist + PrismConst;
+    const double vertical = std::cos(zenith) * target.SDist;
+    const double theta = station.HMode == L'B' ? target.HAng : work.BackBearing + target.AngleFromBS;
+    e = std::sin(theta * kRadiansPerDegree) * horizontal + work.StnE;
+    n = std::cos(theta * kRadiansPerDegree) * horizontal + work.StnN;
+    z = work.StnZ > kNoHeight ? vertical + work.StnZ + station.HtInst - target.HtTarget : work.StnZ;
+    if (!Is_Zero(target.OffsetAlong, false) || !Is_Zero(target.OffsetRight, false) ||
+        !Is_Zero(target.OffsetUp, false)) {
+        ApplyOffsets(e, n, z, target.OffsetAlong, target.OffsetRight, target.OffsetUp, theta);
+    }
+}
+
+int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly, std::vector<std::wstring>* /*records*/) {
+    StationWork work;
+    work.Steps = 0;
+    for (const auto& station : Stations) work.Steps += 1 + station->SSList.size() + station->FSList.size();
+    if (work.Steps == 0) work.Steps = 1;
+
+    bool aborted = false;
+    // setCoord appends point-only nodes as the walk goes; they are passed over.
+    for (std::size_t s = 0; s < Stations.size() && !aborted; ++s) {
+        STNSTRUCT& station = *Stations[s];
+        if (AbortRequested()) {
+            aborted = true;
+            break;
+        }
+        if (station.PointOnly || station.ReverseStn) continue;
+        if (station.BSList.empty() && station.SSList.empty() && station.FSList.empty() && station.Sighted == 0 &&
+            !station.HasCheck) {
+            continue;
+        }
+        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps), kGeneratingGraphics);
+
+        work.BackBearing = 0.0;
+        work.BsReading = station.BkAngle;
+        if (!station.BSList.empty() && station.BSList.front()->MeanValid) {
+            work.BsReading = station.BSList.front()->HAng;
+        }
+        if (station.BkStnGiven) {
+            if (station.BkBearingGiven) {
+                work.BackBearing = station.BkBearing;
+            } else if (!OrientByCoordinates(station, work)) {
+                UpdateProgress(100, L"");
+                return 0;
+            }
+        }
+
+        const int position = PositionStation(station, work, report, fixedOnly);
+        if (position == kPositionFailed) return 0;
+        if (position == kStationLeftOut) continue;
+
+        if (position == kPositionFound) {
+            double be = 0.0, bn = 0.0, bz = kNoHeight;
+            std::wstring back_code;
+            if (findCoord(station.BkStnName, be, bn, bz, back_code, report, true) && Report != nullptr) {
+                work.BackBearing = UWPoint(work.StnE, work.StnN).BearingTo(UWPoint(be, bn));
+            }
+        }
+        const double stored = GetBearingFromArray(station.StnName, station.BkStnName);
+        if (stored >= 0.0) work.BackBearing = stored;
+
+        if ((passes & 2) != 0 && !station.FSList.empty() && !ForwardPass(station, work, report)) aborted = true;
+        if (!aborted && (passes & 4) != 0 && !station.SSList.empty() && !SideShotPass(station, work, report)) {
+            aborted = true;
+        }
+    }
+    UpdateProgress(100, L"");
+    return aborted ? 0 : 1;
+}
+
+int UNeditDatabase::OrientByCoordinates(STNSTRUCT& station, StationWork& work) {
+    if (!station.CoordKnown) {
+        std::wstring code = station.StnCode;
+        if (findCoord(station.StnName, station.East, station.North, station.Height, code, 0, true) ||
+            GetPointFromPtList(station.StnName, station.East, station.North, station.Height, code, 1)) {
+            station.StnCode = code;
+        } else if (FindXYZ(station.StnName, station.East, station.North, station.Height) >= 0) {
+            station.CoordKnown = 1;
+        } else {
+            UCoordEntryDlg dialog(CoordsOrderXY() ? UCoordEntryDlg::kEastFirstId : UCoordEntryDlg::kNorthFirstId, Host);
+            if (dialog.process(station.StnName, UseForAll) != 1) return 0;
+            station.East = dialog.getEast();
+            station.North = dialog.getNorth();
+            station.Height = dialog.getZ();
+            station.StnCode = dialog.getCode();
+            station.CoordKnown = 1;
+        }
+    }
+    const UWPoint here(station.East, station.North, station.Height);
+    double be = 0.0, bn = 0.0, bz = kNoHeight;
+    std::wstring back_code;
+    bool found = findCoord(station.BkStnName, be, bn, bz, back_code, 0, true) != 0;
+    if (!found) {
+        const UNeditPt* point = SearchPt(station.BkStnName);
+        if (point != nullptr) {
+            be = point->x;
+            bn = point->y;
+            bz = point->z;
+            found = !point->IsPTRecord();
+        }
+    }
+    if (found) {
+        work.BackBearing = UWLine(here, UWPoint(be, bn, bz)).Bearing();
+    } else {
+        AskBackStation(station, work, here);
+    }
+    station.BkBearing = work.BackBearing;
+    return 1;
+}
+
+void UNeditDatabase::AskBackStation(const STNSTRUCT& station, StationWork& work, const UWPoint& here) {
+    UBKBCoordDlg dialog(station.BkStnName);
+    // The dialog has OK only: whatever stands in its fields is taken.
+    if (Host != nullptr) Host->RunDialog(dialog);
+    if (dialog.ApplyBearing) {
+        work.BackBearing = dialog.Bearing;
+        const int row = FindRecord(rec::Bkb, station.BkStnName);
+        if (row >= 0) {
+            ReplaceRow(row, FormatBKBRecord(station.BkStnName, station.BkAngle - FirstSwing - CurSwing - HCorr,
+                                            dialog.Bearing));
+        }
+        return;
+    }
+    work.BackBearing = UWLine(here, UWPoint(dialog.East, dialog.North, dialog.Height)).Bearing();
+    const std::wstring text = FormatXYZRecord(station.BkStnName, dialog.East, dialog.North, dialog.Height);
+    double e = 0.0, n = 0.0, z = 0.0;
+    const int row = FindXYZ(station.BkStnName, e, n, z);
+    if (row < 0) {
+        if (ListCtrl != nullptr) ListCtrl->AddRecord(ListCtrl->GetItemCount(), text);
+    } else if (!Is_Zero(e - dialog.East, false) || !Is_Zero(n - dialog.North, false) ||
+               !Is_Zero(z - dialog.Height, false)) {
+        ReplaceRow(row, text);
+    }
+}
+
+int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int report, int fixedOnly) {
+    work.StnE = work.StnN = 0.0;
+    work.StnZ = kNoHeight;
+    work.StnCodeOut.clear();
+    const std::wstring& name = station.StnName;
+    auto take_node = [&]() {
+        work.StnE = station.East;
+        work.StnN = station.North;
+        work.StnZ = station.Height;
+    };
+    // The user is asked when nothing else knows the station; no answer ends the run.
+    auto ask_user = [&](int fix) {
+        double e = 0.0, n = 0.0, z = kNoHeight;
+        if (!getCoord(name, &e, &n, &z, work.StnCodeOut, 1, true)) {
+            ErrorCode = 1;
+            UpdateProgress(100, L"");
+            return false;
+        }
+        setCoord(name, e, n, z, work.StnCodeOut, 8, fix, 1);
+        station.CoordKnown = 1;
+        SaveTravPoint(name, e, n, z, work.StnCodeOut, 1);
+        work.StnE = e;
+        work.StnN = n;
+        work.StnZ = z;
+        return true;
+    };
+
+    if (station.CoordKnown && station.CoordFixed == 1) {
+        take_node();
+        return kPositionFound;
+    }
+    if (station.CoordKnown) {
+        if (fixedOnly) return kStationLeftOut;
+        take_node();
+        setCoord(name, work.StnE, work.StnN, work.StnZ, station.StnCode, 8, report, 1);
+        SaveTravPoint(name, work.StnE, work.StnN, work.StnZ, station.StnCode, 1);
+        return kPositionFound;
+    }
+    double e = 0.0, n = 0.0, z = kNoHeight;
+    if (findCoord(name, e, n, z, work.StnCodeOut, report, true)) {
+        station.East = e;
+        station.North = n;
+        station.Height = z;
+        station.CoordKnown = 1;
+        take_node();
+        return kPositionFound;
+    }
+    if (report == 1) {
+        if (fixedOnly) return kStationLeftOut;
+        return ask_user(report) ? kPositionFound : kPositionFailed;
+    }
+    const UNeditPt* point = SearchPt(name);
+    if (point != nullptr) {
+        work.StnE = point->x;
+        work.StnN = point->y;
+        work.StnZ = point->z;
+        work.StnCodeOut.clear();
+        return kPositionNotFound;
+    }
+    return ask_user(0) ? kPositionNotFound : kPositionFailed;
+}
+
+int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int report) {
+    for (std::size_t t = 0; t < station.FSList.size(); ++t) {
+        SSSTRUCT& target = *station.FSList.at(t);
+        if (AbortRequested()) return 0;
+        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps), kGeneratingGraphics);
+        const int from = GetPointIdx(station.StnName);
+        if (GetTravPointIdx(target.SSName) >= 0) {
+            const int to = GetPointIdx(target.SSName);
+            if (from >= 0 && to >= 0 && from != to) SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 1);
+            continue;
+        }
+        if (!target.AngleValid) continue;
+        double e = 0.0, n = 0.0, z = kNoHeight;
+        ReduceTarget(station, target, work, e, n, z);
+        if (IsSelfObservation(station, target)) continue;
+        if (searchSTN(target.SSName) != nullptr) setCoord(target.SSName, e, n, z, target.SSCode, 8, report, 0);
+        const int to = GetPointIdx(target.SSName);
+        if (from >= 0 && to >= 0 && from != to) SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 0);
+    }
+    return 1;
+}
+
+int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int report) {
+    for (std::size_t t = 0; t < station.SSList.size(); ++t) {
+        SSSTRUCT& target = *station.SSList.at(t);
+        if (AbortRequested()) return 0;
+        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps), kGeneratingGraphics);
+        if (!target.AngleValid || target.ForwardFlag) continue;
+        double e = 0.0, n = 0.0, z = kNoHeight;
+        ReduceTarget(station, target, work, e, n, z);
+        if (IsSelfObservation(station, target)) continue;
+        setCoord(target.SSName, e, n, z, target.SSCode, 8, report, 0);
+    }
+    return 1;
+}

@@ -1,0 +1,45 @@
+#include "ReductionFixture.h"
+
+using ReductionRun = ReductionFixture;
+
+TEST_F(ReductionRun, RowsWithoutObservationsReduceToNothing) {
+    Rows(L"#VERSION-1.0 NEUTRAL FILE\nNOTE FIELD DAY\nDATE ,2026-11-20,\n");
+    ASSERT_EQ(engine.Process(), 1);
+    EXPECT_TRUE(engine.GetStations().empty());
+    EXPECT_EQ(engine.GetDateText(), L"2026-11-20");
+    EXPECT_DOUBLE_EQ(engine.GetDocExtents().GetMaxX(), 100.0);
+}
+
+TEST_F(ReductionRun, OnlyContentRowsCountAsModifications) {
+    Rows(L"#VERSION-1.0 NEUTRAL FILE\nNOTE A\nSTN ID=A,HI=1.5\nSS ID=P1,HA=1,VA=90,SD=5,HT=1.5\n");
+    engine.CreateContent();
+    EXPECT_FALSE(engine.IsContentModified());
+    list.SetRecord(1, L"NOTE B");
+    list.AddRecord(2, L"# a comment");
+    EXPECT_FALSE(engine.IsContentModified());
+    list.SetRecord(3, L"STN ID=A, HI=1.5");   // layout only
+    list.SetRecord(4, L"ss id=p1,ha=1,va=90,sd=5,ht=1.5");
+    EXPECT_FALSE(engine.IsContentModified());
+    list.SetRecord(4, L"SS ID=P1,HA=1,VA=90,SD=6,HT=1.5");
+    EXPECT_TRUE(engine.IsContentModified());
+    list.DeleteItem(4);
+    EXPECT_TRUE(engine.IsContentModified());
+}
+
+TEST_F(ReductionRun, ExtentsCoverThePointsWithAMargin) {
+    Rows(L"#VERSION-1.0 NEUTRAL FILE\nPT ID=A,E=0,N=0,H=0\nPT ID=B,E=100,N=50,H=0\n");
+    ASSERT_EQ(engine.Process(), 1);
+    const UWRect box = engine.GetDocExtents();
+    EXPECT_DOUBLE_EQ(box.GetMinX(), -1.0);
+    EXPECT_DOUBLE_EQ(box.GetMaxX(), 101.0);
+    EXPECT_DOUBLE_EQ(box.GetMinY(), -0.5);
+    EXPECT_DOUBLE_EQ(box.GetMaxY(), 50.5);
+}
+
+TEST(RunErrors, TheErrorTableNamesEachCode) {
+    EXPECT_EQ(CError::MessageOf(-11), L"");
+    EXPECT_EQ(CError::MessageOf(-4), L"MEASUREMENT NOT AVERAGE!!!!");
+    EXPECT_EQ(CError::MessageOf(34702), L"Invalid or empty traverse route !");
+    EXPECT_EQ(CError::MessageOf(1), L"Default Error Has Occurred!!!!");
+    EXPECT_EQ(CError::MessageOf(-1), L"Default Error Has Occurred!!!!");
+}
