@@ -105,6 +105,11 @@ fi
 
 printf '#VERSION-1.0 NEUTRAL FILE\nSTN ID=K\nSS ID=Q,HA=0,VA=90,SD=5,HT=0\n' >"$work/unknown.neu"
 check reduce-unknown-station 0 "$here/expected/unknown_station.json" "" -- "$sxnedit" reduce "$work/unknown.neu" --json
+"$sxnedit" job new "$work/site.job" >/dev/null
+printf 'name,east,north,height,code\nK,300,400,20,CP\n' >"$work/control.csv"
+"$sxnedit" job import-points "$work/site.job" "$work/control.csv" >/dev/null
+check reduce-with-job 0 "$here/expected/job_station.json" "" -- "$sxnedit" reduce "$work/unknown.neu" --json --job "$work/site.job"
+check reduce-missing-job 2 /dev/null "" -- "$sxnedit" reduce "$work/unknown.neu" --job "$work/nojob.job"
 check reduce-missing 2 /dev/null "sxnedit: Failed to open $work/none.neu." -- "$sxnedit" reduce "$work/none.neu"
 check reduce-no-file 64 /dev/null "" -- "$sxnedit" reduce --json
 
