@@ -95,6 +95,13 @@ public:
 
     const UJobSettings* GetJobSettings() const { return settings_; }
 
+    /// The letters in force for the records read so far: linear and angular unit (the
+    /// job's until a UNIT record), horizontal and vertical mode ("A" and "Z" until an AMODE).
+    wchar_t GetFileLengthLetter() const { return nedit::LetterOf(FileLengthUnit()); }
+    wchar_t GetFileAngleLetter() const { return nedit::LetterOf(FileAngleUnit()); }
+    wchar_t GetHModeLetter() const { return CurrentLetter(819, L'A'); }
+    wchar_t GetVModeLetter() const { return CurrentLetter(820, L'Z'); }
+
 private:
     nedit::LengthUnit WorkingLengthUnit() const;
     nedit::LengthUnit FileLengthUnit() const;

@@ -13,6 +13,9 @@
 #include "reduction/UBKBCoordDlg.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "reduction/UNeditDatabase.h"
+#include "report/UNeditReport.h"
+#include "platform/messages/Translate.h"
+#include "platform/text/Format.h"
 
 namespace {
 
@@ -31,6 +34,8 @@ struct UNeditDatabase::StationWork {
     double BsReading = 0.0;
     std::size_t StepsDone = 0;
     std::size_t Steps = 1;
+    bool HasShots = false;
+    bool HeadPrinted = false;
 };
 
 void UNeditDatabase::geo_coord(double e, double n, double bearing, double dist, double* eOut, double* nOut) {
@@ -67,11 +72,14 @@ void UNeditDatabase::ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target, co
     }
 }
 
-int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly, std::vector<std::wstring>* /*records*/) {
+int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly, std::vector<std::wstring>* records) {
     StationWork work;
     work.Steps = 0;
     for (const auto& station : Stations) work.Steps += 1 + station->SSList.size() + station->FSList.size();
     if (work.Steps == 0) work.Steps = 1;
+
+    const bool printing = Report != nullptr && report == 1;
+    if (printing) PrintRunHead();
 
     bool aborted = false;
     // setCoord appends point-only nodes as the walk goes; they are passed over.
@@ -110,11 +118,16 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly, std::vec
             double be = 0.0, bn = 0.0, bz = kNoHeight;
             std::wstring back_code;
             if (findCoord(station.BkStnName, be, bn, bz, back_code, report, true) && Report != nullptr) {
-                work.BackBearing = UWPoint(work.StnE, work.StnN).BearingTo(UWPoint(be, bn));
+                double distance = 0.0;
+                UNeditReport::geo_brgdst(work.StnE, work.StnN, be, bn, &work.BackBearing, &distance);
             }
         }
         const double stored = GetBearingFromArray(station.StnName, station.BkStnName);
         if (stored >= 0.0) work.BackBearing = stored;
+
+        work.HasShots = HaveSideshotsToReport(&station, records);
+        work.HeadPrinted = false;
+        if (printing && !(passes == 4 && !work.HasShots)) PrintStationBlock(station, work);
 
         if ((passes & 2) != 0 && !station.FSList.empty() && !ForwardPass(station, work, report)) aborted = true;
         if (!aborted && (passes & 4) != 0 && !station.SSList.empty() && !SideShotPass(station, work, report)) {
@@ -255,6 +268,10 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
 int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int report) {
     for (std::size_t t = 0; t < station.FSList.size(); ++t) {
         SSSTRUCT& target = *station.FSList.at(t);
+        if (!work.HeadPrinted && Report != nullptr && report == 1) {
+            Report->PrintSSHead();
+            work.HeadPrinted = true;
+        }
         if (AbortRequested()) return 0;
         UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps), kGeneratingGraphics);
         const int from = GetPointIdx(station.StnName);
@@ -266,6 +283,7 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
         if (!target.AngleValid) continue;
         double e = 0.0, n = 0.0, z = kNoHeight;
         ReduceTarget(station, target, work, e, n, z);
+        if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, true);
         if (IsSelfObservation(station, target)) continue;
         if (searchSTN(target.SSName) != nullptr) setCoord(target.SSName, e, n, z, target.SSCode, 8, report, 0);
         const int to = GetPointIdx(target.SSName);
@@ -279,11 +297,78 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
         SSSTRUCT& target = *station.SSList.at(t);
         if (AbortRequested()) return 0;
         UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps), kGeneratingGraphics);
+        if (!work.HeadPrinted && Report != nullptr && report == 1) {
+            if (work.HasShots) Report->PrintSSHead();
+            work.HeadPrinted = true;
+        }
         if (!target.AngleValid || target.ForwardFlag) continue;
         double e = 0.0, n = 0.0, z = kNoHeight;
         ReduceTarget(station, target, work, e, n, z);
+        if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, false);
         if (IsSelfObservation(station, target)) continue;
         setCoord(target.SSName, e, n, z, target.SSCode, 8, report, 0);
     }
     return 1;
+}
+
+void UNeditDatabase::PrintRunHead() {
+    using nedit::Format;
+    using nedit::Translate;
+    if (!Report->GetHeaderOutputed()) {
+        Report->PrintMainReportHead();
+        // The corrections of the file are not printed here: the head shows them as zero.
+        Report->PrintHeadHDegree(L"HCORR", 0.0, true);
+        Report->PrintHeadVDegree(L"VCORR", 0.0);
+        Report->PrintEdmHead();
+        Report->PrintHeadDVal(L"PRISM", PrismConst);
+        Report->WriteText(Format(L"%-29s : %-15.8f", Translate(L"Scale Factor"), ScaleFactor), 0, 1, 0);
+        Report->SetHeaderOutputed(true);
+    }
+    if (!Is_Zero(FirstSwing, false)) Report->PrintHeadHDegree(Translate(L"Swing"), FirstSwing, true);
+    if (!DateText.empty()) {
+        Report->WriteText(Format(L"%s                          : %-s", Translate(L"Date"), DateText), 0, 1, 0);
+    }
+}
+
+void UNeditDatabase::PrintStationBlock(const STNSTRUCT& station, const StationWork& work) {
+    const bool bearing_mode = station.HMode == L'B';
+    Report->PrintOccStnBlk(&station, station.StnName, work.StnE, work.StnN, work.StnZ, station.StnCode,
+                           station.HtInst, GetStnScaleFactor(station.StnName),
+                           bearing_mode ? std::wstring() : station.BkStnName, bearing_mode ? 0.0 : work.BackBearing,
+                           bearing_mode ? 0.0 : work.BsReading);
+    if (!Is_Zero(station.Swing - FirstSwing, false)) Report->PrintHeadHDegree(L"Swing", station.Swing, true);
+}
+
+void UNeditDatabase::PrintTarget(const STNSTRUCT& station, const SSSTRUCT& target, double e, double n, double z,
+                                 bool forward) {
+    using nedit::Format;
+    using nedit::Translate;
+    const bool self = IsSelfObservation(station, target);
+    if (self) {
+        Report->WriteText(forward ? Translate(L"   *** Observation to the station itself not processed  ***")
+                                  : Format(L"   *** %s  ***", Translate(L"Observation to the station itself not processed")),
+                          0, 1, 0);
+    }
+    const MeasurementList& measurements = *target.Meas;
+    if (measurements.size() >= 2) {
+        for (const MEASSTRUCT& m : measurements) {
+            Report->PrintSSLine(target.SSName, m.HAng, m.VAng, m.SDist, m.HtTarget, 0.0, 0.0, 0.0, L"", 0, false);
+        }
+    }
+    Report->PrintSSLine((measurements.size() >= 2 ? L"*" : L"") + target.SSName, target.HAng, target.VAng,
+                        target.SDist, target.HtTarget, e, n, z, target.SSCode, target.RecordNo, true);
+    if (!Is_Zero(target.OffsetAlong, false) || !Is_Zero(target.OffsetRight, false) ||
+        !Is_Zero(target.OffsetUp, false)) {
+        Report->PrintOffset(target.OffsetAlong, target.OffsetRight, target.OffsetUp);
+    }
+    if (self) Report->WriteText(L"   ****************************************************************", 0, 1, 0);
+}
+
+bool UNeditDatabase::HaveSideshotsToReport(const STNSTRUCT* station, const std::vector<std::wstring>* /*records*/) const {
+    if (station == nullptr) return false;
+    for (const auto& target : station->SSList) {
+        if (StnPtNames.count(target.get()) != 0 || ChkShotMap.count(target.get()) != 0) return true;
+        if (target->AngleValid && !target->ForwardFlag) return true;
+    }
+    return false;
 }

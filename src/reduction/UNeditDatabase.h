@@ -74,6 +74,7 @@ public:
     bool GetOutput() const { return Output; }
     void SetListCtrlPtr(UListCtrl* list) { ListCtrl = list; }
     void SetReportPtr(UNeditReport* report) { Report = report; }
+    UNeditReport* GetReport() const { return Report; }
     void SetFileName(const std::wstring& name) { FileName = name; }
     const std::wstring& GetFileName() const { return FileName; }
     void InitHeadList();
@@ -174,6 +175,8 @@ public:
 
     // ---- Reduction --------------------------------------------------------------------
     int ProcessCoord(int passes, int report, int fixedOnly, std::vector<std::wstring>* records);
+    /// A station has side shots, points or check shots whose lines the report prints.
+    bool HaveSideshotsToReport(const STNSTRUCT* station, const std::vector<std::wstring>* records) const;
     static void geo_coord(double e, double n, double bearing, double dist, double* eOut, double* nOut);
     static void ApplyOffsets(double& e, double& n, double& z, double along, double right, double up,
                              double bearing);
@@ -242,6 +245,10 @@ private:
     int ForwardPass(STNSTRUCT& station, StationWork& work, int report);
     int SideShotPass(STNSTRUCT& station, StationWork& work, int report);
     bool IsSelfObservation(const STNSTRUCT& station, const SSSTRUCT& target) const;
+    // The report's part of the walk; called only with a report and reporting on.
+    void PrintRunHead();
+    void PrintStationBlock(const STNSTRUCT& station, const StationWork& work);
+    void PrintTarget(const STNSTRUCT& station, const SSSTRUCT& target, double e, double n, double z, bool forward);
 
     // Collaborators.
     UNeutralFileFormat* Doc;

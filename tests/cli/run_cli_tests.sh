@@ -7,6 +7,8 @@ here="$2"
 data="$here/../data"
 work="$(mktemp -d)"
 trap 'rm -rf "$work"' EXIT
+# Settings files (NEDIT.INI) go to a configuration directory of the test's own.
+export SXNEDIT_CONFIG="$work/config"
 passed=0
 failed=0
 
@@ -110,6 +112,16 @@ printf 'name,east,north,height,code\nK,300,400,20,CP\n' >"$work/control.csv"
 "$sxnedit" job import-points "$work/site.job" "$work/control.csv" >/dev/null
 check reduce-with-job 0 "$here/expected/job_station.json" "" -- "$sxnedit" reduce "$work/unknown.neu" --json --job "$work/site.job"
 check reduce-missing-job 2 /dev/null "" -- "$sxnedit" reduce "$work/unknown.neu" --job "$work/nojob.job"
+printf '#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nSTN ID=A,HI=1.5\nXYZ ID=A,E=1000,N=2000,H=50\nBKB ID=B,BRG=45,HA=0\nSS ID=P1,HA=90,VA=90,SD=100,HT=1.5,CO=FC\n' >"$work/small.neu"
+check reduce-report 0 "$here/expected/small_report.txt" "" -- "$sxnedit" reduce "$work/small.neu" --report - --columns ID,HA,SD,EC,NC,HC,CO --angles deg --lengths ft
+cmp -s "$SXNEDIT_CONFIG/NEDIT.INI" "$here/../../data/NEDIT.INI" && passed=$((passed + 1)) ||
+    { echo "FAIL nedit-ini-installed: the default NEDIT.INI was not installed"; failed=$((failed + 1)); }
+check reduce-bad-columns 64 /dev/null "" -- "$sxnedit" reduce "$work/small.neu" --columns ID,XX
+check reduce-bad-angles 64 /dev/null "" -- "$sxnedit" reduce "$work/small.neu" --angles rad
+chmod 444 "$SXNEDIT_CONFIG/NEDIT.INI"
+"$sxnedit" reduce "$work/small.neu" --report "$work/small.txt" >/dev/null 2>&1 && grep -q 'Occupied Station' "$work/small.txt" &&
+    [ "$(stat -c %a "$SXNEDIT_CONFIG/NEDIT.INI")" = 444 ] && passed=$((passed + 1)) ||
+    { echo "FAIL reduce-read-only-ini: no report or the file mode changed"; failed=$((failed + 1)); }
 check reduce-missing 2 /dev/null "sxnedit: Failed to open $work/none.neu." -- "$sxnedit" reduce "$work/none.neu"
 check reduce-no-file 64 /dev/null "" -- "$sxnedit" reduce --json
 

@@ -2,7 +2,8 @@
 
 #include <gtest/gtest.h>
 
-#include "../platform/job/JobTestSupport.h"
+#include "../support/TestSupport.h"
+#include "platform/job/USurveyDoc.h"
 #include "ReductionFixture.h"
 #include "platform/job/UDBPoint.h"
 #include "reduction/UCoordEntryDlg.h"

@@ -5,16 +5,24 @@
 
 #include "BuildInfo.h"
 #include "platform/text/WideText.h"
+#include "report/NeditIni.h"
 
-bool RecordSession::LoadDefinition() {
-    if (format.LoadNeutralFileDefinition(nedit::FromUtf8(DataDirectory()))) return true;
+bool RecordSession::Start(USurveyDoc* job) {
+    nedit::InstallDefaultNeditIni(DataDirectory());
+    doc = std::make_unique<UNeditDoc>(job);
+    list = std::make_unique<UListCtrl>(doc.get());
+    if (doc->LoadNeutralFileDefinition(nedit::FromUtf8(DataDirectory()))) return true;
     std::fprintf(stderr, "sxnedit: the record definition could not be loaded: %s\n",
-                 nedit::ToUtf8(format.LastDefinitionError()).c_str());
+                 nedit::ToUtf8(doc->LastDefinitionError()).c_str());
     return false;
 }
 
-UNeditDatabase& RecordSession::StartEngine(USurveyDoc* job) {
-    engine = std::make_unique<UNeditDatabase>(&format, &list, job, &host);
+UNeditDatabase& RecordSession::StartEngine(bool withReport) {
+    engine = std::make_unique<UNeditDatabase>(doc.get(), list.get(), doc->GetSurveyDoc(), &host);
+    if (withReport) {
+        report = std::make_unique<UNeditReport>(doc.get(), L"Raw Data Reduction Report");
+        engine->SetReportPtr(report.get());
+    }
     return *engine;
 }
 

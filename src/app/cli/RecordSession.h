@@ -1,28 +1,30 @@
 #pragma once
-// What every command that reads records needs: job settings, the format service with the
-// record definition loaded, a record list, a dialog host and an engine, wired together.
+// What every command that reads records needs: the raw-data document with the record
+// definition loaded, a record list, a dialog host, the report and an engine, wired together.
 
 #include <memory>
 #include <string>
 
 #include "ConsoleDialogHost.h"
 #include "document/UListCtrl.h"
-#include "platform/job/UJobSettings.h"
-#include "records/UNeutralFileFormat.h"
+#include "document/UNeditDoc.h"
 #include "reduction/UNeditDatabase.h"
+#include "report/UNeditReport.h"
 
 class USurveyDoc;
 
 struct RecordSession {
-    /// Loads the record definition; false, with a message on standard error, when it fails.
-    bool LoadDefinition();
-    /// Builds the engine, on the job when one is given.
-    UNeditDatabase& StartEngine(USurveyDoc* job = nullptr);
+    /// Installs the default NEDIT.INI when there is none, makes the document on `job` (may
+    /// be null) and loads the record definition; false, with a message on standard error,
+    /// when the definition cannot be loaded.
+    bool Start(USurveyDoc* job = nullptr);
+    /// The engine, with the report when `withReport` is set.
+    UNeditDatabase& StartEngine(bool withReport);
 
-    UJobSettings settings;
-    UNeutralFileFormat format{&settings};
-    UListCtrl list{&format};
     ConsoleDialogHost host;
+    std::unique_ptr<UNeditDoc> doc;
+    std::unique_ptr<UListCtrl> list;
+    std::unique_ptr<UNeditReport> report;
     std::unique_ptr<UNeditDatabase> engine;
 };
 

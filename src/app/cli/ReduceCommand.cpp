@@ -1,7 +1,10 @@
 // sxnedit reduce FILE.neu: a full reduction of a neutral file, its points as a table, as
 // JSON, or as a CSV file.
 
+#include <algorithm>
+#include <cctype>
 #include <cstdio>
+#include <initializer_list>
 #include <string>
 
 #include "Commands.h"
@@ -18,9 +21,40 @@ struct ReduceOptions {
     std::string file;
     std::string job;
     std::string points_csv;
+    std::string report;  // a file, or "-" for standard output
+    int angles = -1;     // report output units; -1 keeps the job's
+    int lengths = -1;
+    std::string columns;
+    bool columns_given = false;
     bool json = false;
     bool interactive = false;
 };
+
+// The place of `word` in `choices`, or -1.
+int Choice(const std::string& word, std::initializer_list<const char*> choices) {
+    int index = 0;
+    for (const char* choice : choices) {
+        if (word == choice) return index;
+        ++index;
+    }
+    return -1;
+}
+
+// Column tokens as --columns takes them, separated by commas.
+bool ValidColumns(const std::string& columns) {
+    static const char* const kTokens[] = {"ID", "LN", "HA", "VA", "SD", "HD", "VD", "HT", "CO", "EC", "NC", "HC"};
+    std::size_t start = 0;
+    while (start <= columns.size()) {
+        const std::size_t comma = std::min(columns.find(',', start), columns.size());
+        std::string token = columns.substr(start, comma - start);
+        for (char& c : token) c = static_cast<char>(std::toupper(static_cast<unsigned char>(c)));
+        if (!token.empty() && std::find(std::begin(kTokens), std::end(kTokens), token) == std::end(kTokens)) {
+            return false;
+        }
+        start = comma + 1;
+    }
+    return true;
+}
 
 bool ParseOptions(const std::vector<std::string>& args, ReduceOptions& options) {
     for (std::size_t i = 0; i < args.size(); ++i) {
@@ -34,6 +68,15 @@ bool ParseOptions(const std::vector<std::string>& args, ReduceOptions& options) 
             options.job = args[++i];
         } else if (arg == "--points" && has_value) {
             options.points_csv = args[++i];
+        } else if (arg == "--report" && has_value) {
+            options.report = args[++i];
+        } else if (arg == "--angles" && has_value && (options.angles = Choice(args[i + 1], {"dms", "deg", "gon"})) >= 0) {
+            ++i;
+        } else if (arg == "--lengths" && has_value && (options.lengths = Choice(args[i + 1], {"m", "ft", "usft"})) >= 0) {
+            ++i;
+        } else if (arg == "--columns" && has_value && ValidColumns(args[i + 1])) {
+            options.columns = args[++i];
+            options.columns_given = true;
         } else if (!arg.empty() && arg[0] != '-' && options.file.empty()) {
             options.file = arg;
         } else {
@@ -41,8 +84,15 @@ bool ParseOptions(const std::vector<std::string>& args, ReduceOptions& options) 
             return false;
         }
     }
-    if (options.file.empty()) std::fprintf(stderr, "sxnedit: reduce needs a neutral file (see sxnedit --help)\n");
-    return !options.file.empty();
+    if (options.file.empty()) {
+        std::fprintf(stderr, "sxnedit: reduce needs a neutral file (see sxnedit --help)\n");
+        return false;
+    }
+    if (options.json && options.report == "-") {
+        std::fprintf(stderr, "sxnedit: reduce: --json and --report - both want standard output\n");
+        return false;
+    }
+    return true;
 }
 
 std::vector<PointRow> ReducedPoints(const UNeditDatabase& engine) {
@@ -94,10 +144,6 @@ void PrintJson(const UNeditDatabase& engine, const std::vector<std::wstring>& me
 int RunReduce(const std::vector<std::string>& args) {
     ReduceOptions options;
     if (!ParseOptions(args, options)) return exit_status::Usage;
-    RecordSession session;
-    session.host.SetInteractive(options.interactive);
-    session.host.SetEcho(!options.json);
-    if (!session.LoadDefinition()) return exit_status::Failed;
     std::unique_ptr<USurveyDoc> job;
     if (!options.job.empty()) {
         try {
@@ -106,9 +152,17 @@ int RunReduce(const std::vector<std::string>& args) {
             std::fprintf(stderr, "sxnedit: %s\n", error.what());
             return exit_status::Unreadable;
         }
-        session.settings = job->GetSettings();  // the job's units and decimals
     }
-    UNeditDatabase& engine = session.StartEngine(job.get());
+    RecordSession session;
+    session.host.SetInteractive(options.interactive);
+    session.host.SetEcho(!options.json);
+    if (!session.Start(job.get())) return exit_status::Failed;
+    OutParamStruct& parameters = session.doc->GetOutputParameters();
+    if (options.angles >= 0) parameters.AngularUnit = options.angles;
+    if (options.lengths >= 0) parameters.LinearUnit = options.lengths;
+    if (options.columns_given) SetFlagsFromOrder(parameters, nedit::FromUtf8(options.columns));
+
+    UNeditDatabase& engine = session.StartEngine(!options.report.empty());
     if (!engine.LoadNeFile(nedit::FromUtf8(options.file))) {
         if (options.json) {
             for (const std::wstring& message : session.host.Messages()) {
@@ -118,10 +172,18 @@ int RunReduce(const std::vector<std::string>& args) {
         return exit_status::Unreadable;
     }
     const int result = engine.Process();
+    if (options.report == "-") {
+        std::string text = nedit::ToUtf8(session.report->GetText());
+        if (!text.empty() && text.back() != '\n') text += '\n';
+        std::fputs(text.c_str(), stdout);
+    } else if (!options.report.empty() && !session.report->SaveAsText(options.report)) {
+        std::fprintf(stderr, "sxnedit: cannot write %s\n", options.report.c_str());
+        return exit_status::Failed;
+    }
     if (options.json) {
         PrintJson(engine, session.host.Messages());
-    } else {
-        const std::string table = PointsTable(ReducedPoints(engine), session.settings.GetLengthDecimals());
+    } else if (options.report != "-") {
+        const std::string table = PointsTable(ReducedPoints(engine), session.doc->GetSettings().GetLengthDecimals());
         std::fputs(table.c_str(), stdout);
     }
     if (!options.points_csv.empty() && !WritePointsCsv(options.points_csv, ReducedPoints(engine))) {

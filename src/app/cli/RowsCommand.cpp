@@ -12,16 +12,16 @@ int RunRows(const std::vector<std::string>& args) {
         return exit_status::Usage;
     }
     RecordSession session;
-    if (!session.LoadDefinition()) return exit_status::Failed;
-    if (!session.StartEngine().LoadNeFile(nedit::FromUtf8(args[0]))) {
+    if (!session.Start()) return exit_status::Failed;
+    if (!session.StartEngine(false).LoadNeFile(nedit::FromUtf8(args[0]))) {
         if (session.host.Messages().empty()) {
             std::fprintf(stderr, "sxnedit: %s holds no records\n", args[0].c_str());
         }
         return exit_status::Unreadable;
     }
     std::string out;
-    for (int row = 0; row < session.list.GetItemCount(); ++row) {
-        out += nedit::ToUtf8(session.list.GetItemText(row));
+    for (int row = 0; row < session.list->GetItemCount(); ++row) {
+        out += nedit::ToUtf8(session.list->GetItemText(row));
         out += '\n';
         if (out.size() > (1 << 20)) {
             std::fwrite(out.data(), 1, out.size(), stdout);

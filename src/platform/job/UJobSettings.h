@@ -4,6 +4,12 @@
 // aperture and height display, and how angles and feet are written. A job keeps them in
 // its "job" settings section (see JobSettingsStore.h); a default-made object holds the
 // defaults of a new job.
+//
+// It also writes lengths, angles and areas as the job displays them. Lengths are held in the
+// job's length unit everywhere in the system, so the length services take a value in that
+// unit and convert nothing; a value that rounds to zero at the places shown carries no sign.
+
+#include <string>
 
 #include "platform/units/Units.h"
 
@@ -49,6 +55,33 @@ class UJobSettings {
     int GetFootInchPrecision() const { return foot_inch_precision_; }
     void SetFootInchPrecision(int denominator) { foot_inch_precision_ = denominator; }
 
+    /// A length in the job's unit as the job displays it: `decimals` places after the point
+    /// ("%.*f", so -1.23456 with 3 is "-1.235"), or, when the unit is feet or US feet and the
+    /// foot format is kFeetAndInches, feet and inches to the nearest 1/`inch_fraction` inch
+    /// in lowest terms: 10.5 gives 10' 6", 3.2604 gives 3' 3 1/8" at sixteenths. Whole
+    /// inches are always shown (10' 0"), and decimals play no part there.
+    /// - `with_unit`: append " m", " ft" or " usft" to a decimal length (feet and inches carry
+    ///   their own marks).
+    /// - `plus_sign`: write '+' before a value above zero, as differences are often shown.
+    /// - `decimals`: below 0, the job's length decimals.
+    /// - `inch_fraction`: denominator of the inch fraction; below 1 (the suite's callers pass
+    ///   -1), the job's FootInchPrecision.
+    /// - `coordinate`, `reserved`: accepted as the suite's callers pass them (true for a
+    ///   coordinate difference) and without effect: a coordinate and a length display alike.
+    /// So (false, false, 3, -1, ...) gives three decimals and the job's unit and foot format.
+    std::wstring LengthToString(double value, bool with_unit, bool plus_sign, int decimals,
+                                int inch_fraction, bool coordinate, bool reserved) const;
+    /// A value already in the job's unit, such as ConvertLength gives; the arguments as for
+    /// LengthToString. As stored lengths are in the job's unit too, the two write alike.
+    std::wstring UnitLengthToString(double value, bool with_unit, bool plus_sign, int decimals,
+                                    int inch_fraction, bool reserved) const;
+    /// A distance between points; the arguments as for LengthToString, the last two accepted
+    /// and without effect.
+    std::wstring DistanceToString(double value, bool with_unit, bool plus_sign, int decimals,
+                                  int inch_fraction, bool reserved1, bool reserved2) const;
+    /// `value`, a length in `from` units, expressed in the job's length unit.
+    double ConvertLength(nedit::LengthUnit from, double value) const;
+
     bool operator==(const UJobSettings& other) const;
     bool operator!=(const UJobSettings& other) const { return !(*this == other); }
 
@@ -64,3 +97,14 @@ class UJobSettings {
     int foot_format_ = kDecimalFeet;
     int foot_inch_precision_ = 16;
 };
+
+/// Writes into `text` the angle `degrees` (decimal degrees) as the job displays angles: its
+/// angle unit and angle decimals, through UFormatAngle (the angle keeps its sign and is not
+/// brought into one turn). With kAngleMarked the marks are added: 123°45'30" (at least whole
+/// seconds are shown, finer with more than 4 decimals), "123.7583°", "137.5093g". `mode` is
+/// kept for the suite's callers and has no effect. The text has no leading blanks.
+void ConvertAngleToDisplay(const UJobSettings& job, double degrees, std::wstring& text, int mode);
+
+/// An area in square metres expressed in the square of the job's length unit
+/// (1 m² is 10.7639104 ft²).
+double ConvertAreaToDisplay(const UJobSettings& job, double square_metres);

@@ -2,12 +2,11 @@
 
 #include <sys/stat.h>
 
-#include <cstdlib>
-
 #include "platform/geometry/UWPoint.h"
 #include "platform/job/JobSettingsStore.h"
 #include "platform/job/SettingsTable.h"
 #include "platform/job/USVSelectionList.h"
+#include "platform/settings/ConfigDirectory.h"
 #include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
 
@@ -21,12 +20,7 @@ int ObjectKindOf(long id) {
 }
 
 std::string DefaultSharedCodeLibraryPath() {
-    const char* config = std::getenv("SXNEDIT_CONFIG");
-    if (config != nullptr && *config != '\0') return std::string(config) + "/SurveyCodes.csv";
-    const char* xdg = std::getenv("XDG_CONFIG_HOME");
-    if (xdg != nullptr && *xdg != '\0') return std::string(xdg) + "/sxnedit/SurveyCodes.csv";
-    const char* home = std::getenv("HOME");
-    return std::string(home != nullptr ? home : ".") + "/.config/sxnedit/SurveyCodes.csv";
+    return ConfigFile("SurveyCodes.csv");
 }
 
 }  // namespace nedit

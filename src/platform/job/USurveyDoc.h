@@ -40,8 +40,9 @@ constexpr int kPolylineKind = 16;
 /// and 22 as polylines (16), as other programs of the suite number their variants.
 int ObjectKindOf(long id);
 
-/// The office-wide survey code library: $SXNEDIT_CONFIG/SurveyCodes.csv when that variable
-/// is set, else $XDG_CONFIG_HOME/sxnedit/SurveyCodes.csv, else ~/.config/sxnedit/SurveyCodes.csv.
+/// The office-wide survey code library: SurveyCodes.csv in the configuration directory
+/// (ConfigDirectory.h): $SXNEDIT_CONFIG/SurveyCodes.csv when that variable is set, else
+/// $XDG_CONFIG_HOME/sxnedit/SurveyCodes.csv, else ~/.config/sxnedit/SurveyCodes.csv.
 std::string DefaultSharedCodeLibraryPath();
 
 }  // namespace nedit

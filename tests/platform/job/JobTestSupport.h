@@ -1,5 +1,5 @@
 #pragma once
-// A temporary folder per test with a job file in it, removed with everything in it at the end.
+// A test with a job file of its own in a temporary folder.
 
 #include <gtest/gtest.h>
 #include <stdlib.h>
@@ -11,6 +11,7 @@
 #include <memory>
 #include <string>
 
+#include "../../support/TestSupport.h"
 #include "platform/job/USurveyDoc.h"
 
 namespace nedit::test {
@@ -19,36 +20,6 @@ namespace nedit::test {
 inline std::string DataDir() {
     return std::string(SXNEDIT_TEST_DATA) + "/../../data";
 }
-
-class TempDir {
-  public:
-    TempDir() {
-        char pattern[] = "/tmp/sxnedit-job-XXXXXX";
-        const char* made = mkdtemp(pattern);
-        path_ = made != nullptr ? made : "";
-    }
-    ~TempDir() {
-        if (path_.empty()) return;
-        std::error_code ignored;
-        namespace fs = std::filesystem;
-        fs::permissions(path_, fs::perms::owner_all, fs::perm_options::add, ignored);
-        for (const auto& entry : fs::recursive_directory_iterator(path_, ignored)) {
-            fs::permissions(entry.path(), fs::perms::owner_all, fs::perm_options::add, ignored);
-        }
-        fs::remove_all(path_, ignored);
-    }
-    TempDir(const TempDir&) = delete;
-    TempDir& operator=(const TempDir&) = delete;
-
-    const std::string& Path() const { return path_; }
-    std::string File(const std::string& name) const { return path_ + "/" + name; }
-    void Write(const std::string& name, const std::string& bytes) const {
-        std::ofstream(File(name), std::ios::binary) << bytes;
-    }
-
-  private:
-    std::string path_;
-};
 
 /// A test with a fresh job of its own, holding the default code library.
 class JobTest : public ::testing::Test {

@@ -1,0 +1,37 @@
+#include "platform/report/UReportDoc.h"
+
+#include <gtest/gtest.h>
+
+TEST(UReportDoc, WritesLinesAndKeepsBlocksOnOnePage) {
+    UReportDoc report(L"Reduction");
+    report.SetPageLength(5);
+    report.WriteText(L"head", 0, 1);
+    report.WriteText(L"a", 0, 0);
+    report.WriteText(L"b", 0, 2);  // appended to the same line, then a blank line
+    EXPECT_EQ(report.GetText(), L"head\nab\n\n");
+    // Three lines are used; a block of three does not fit in the two left.
+    report.KeepLines(3);
+    report.WriteText(L"block", 0, 1);
+    report.KeepLines(1);  // fits on the new page
+    report.WriteText(L"next", 0, 1);
+    EXPECT_EQ(report.GetText(), L"head\nab\n\n\fblock\nnext\n");
+    report.Clear();
+    EXPECT_EQ(report.GetText(), L"");
+    // Endless pages never break; a block at the top of a page does not break either.
+    report.SetPageLength(0);
+    report.NewLines(100);
+    report.KeepLines(50);
+    EXPECT_EQ(report.GetText().find(L'\f'), std::wstring::npos);
+    report.SetPageLength(2);
+    report.Clear();
+    report.KeepLines(10);
+    EXPECT_EQ(report.GetText(), L"");
+}
+
+TEST(UReportDoc, SavesItsTextAsUtf8) {
+    UReportDoc report;
+    report.WriteText(L"Station \u00c9", 0, 1);
+    const std::string path = ::testing::TempDir() + "report.txt";
+    ASSERT_TRUE(report.SaveAsText(path));
+    EXPECT_FALSE(report.SaveAsText(::testing::TempDir() + "no/such/dir/report.txt"));
+}
