@@ -1,10 +1,15 @@
 #include "document/UListCtrl.h"
 
+#include <algorithm>
+
+#include "platform/text/Format.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
 #include "records/UNeutralFileFormat.h"
 
 UListCtrl::UListCtrl(const UNeutralFileFormat* format) : format_(format) {}
+
+// ---- Rows -------------------------------------------------------------------------------
 
 std::wstring UListCtrl::NormaliseRecord(const std::wstring& text) const {
     // Blanks around a row carry nothing, and a leading one would hide the record's key.
@@ -25,22 +30,218 @@ int UListCtrl::AddRecord(int row, const std::wstring& text) {
     std::wstring normalised = NormaliseRecord(text);
     if (normalised.empty()) return -1;
     if (row < 0 || row > GetItemCount()) row = GetItemCount();
-    rows_.insert(rows_.begin() + row, std::move(normalised));
+    InsertRows(row, {normalised});
+    // A download adds a row at a time; rebuilding the form for each would only slow it.
+    if (form_ != nullptr && !IsAbortProcessOn()) ShowRecord(normalised, row);
     return row;
 }
 
 int UListCtrl::SetRecord(int row, const std::wstring& text) {
     std::wstring normalised = NormaliseRecord(text);
-    if (normalised.empty() || row < 0 || row >= GetItemCount()) return -1;
-    rows_[static_cast<std::size_t>(row)] = std::move(normalised);
+    if (normalised.empty() || !InRange(row)) return -1;
+    ReplaceRow(row, std::move(normalised));
     return row;
 }
 
 std::wstring UListCtrl::GetItemText(int row) const {
-    if (row < 0 || row >= GetItemCount()) return {};
+    if (!InRange(row)) return {};
     return rows_[static_cast<std::size_t>(row)];
 }
 
+void UListCtrl::DeleteAllItems() {
+    const bool had_selection = GetFirstSelected() >= 0 || focus_ >= 0;
+    rows_.clear();
+    selected_.clear();
+    focus_ = anchor_ = drop_target_ = -1;
+    if (events_ != nullptr) events_->RowsCleared();
+    if (had_selection) NotifySelection();
+}
+
 void UListCtrl::DeleteItem(int row) {
-    if (row >= 0 && row < GetItemCount()) rows_.erase(rows_.begin() + row);
+    if (InRange(row)) RemoveRows(row, 1);
+}
+
+void UListCtrl::Reserve(std::size_t rows) {
+    rows_.reserve(rows);
+    selected_.reserve(rows);
+}
+
+void UListCtrl::InsertRows(int row, std::vector<std::wstring> texts) {
+    if (texts.empty()) return;
+    const int count = static_cast<int>(texts.size());
+    rows_.insert(rows_.begin() + row, std::make_move_iterator(texts.begin()),
+                 std::make_move_iterator(texts.end()));
+    selected_.insert(selected_.begin() + row, texts.size(), 0);
+    // Focus and anchor stay on the rows they were on, which have moved down.
+    if (focus_ >= row) focus_ += count;
+    if (anchor_ >= row) anchor_ += count;
+    if (events_ != nullptr) events_->RowsInserted(row, count);
+}
+
+void UListCtrl::RemoveRows(int row, int count) {
+    count = std::min(count, GetItemCount() - row);
+    if (row < 0 || count <= 0) return;
+    const auto first = selected_.begin() + row;
+    const bool lost_selection = std::find(first, first + count, 1) != first + count;
+    rows_.erase(rows_.begin() + row, rows_.begin() + row + count);
+    selected_.erase(first, first + count);
+    bool lost_focus = false;
+    if (focus_ >= row + count) {
+        focus_ -= count;
+    } else if (focus_ >= row) {
+        focus_ = -1;
+        lost_focus = true;
+    }
+    if (anchor_ >= row + count) {
+        anchor_ -= count;
+    } else if (anchor_ >= row) {
+        anchor_ = -1;
+    }
+    if (events_ != nullptr) events_->RowsRemoved(row, count);
+    if (lost_selection || lost_focus) NotifySelection();
+}
+
+void UListCtrl::ReplaceRow(int row, std::wstring text) {
+    rows_[static_cast<std::size_t>(row)] = std::move(text);
+    if (events_ != nullptr) events_->RowChanged(row);
+}
+
+// ---- Selection and focus -------------------------------------------------------------------
+
+int UListCtrl::GetSelectedCount() const {
+    return static_cast<int>(std::count(selected_.begin(), selected_.end(), 1));
+}
+
+bool UListCtrl::IsSelected(int row) const {
+    return InRange(row) && selected_[static_cast<std::size_t>(row)] != 0;
+}
+
+int UListCtrl::GetFirstSelected() const {
+    return GetNextSelected(-1);
+}
+
+int UListCtrl::GetNextSelected(int row) const {
+    const auto from = selected_.begin() + std::max(row + 1, 0);
+    if (from >= selected_.end()) return -1;
+    const auto found = std::find(from, selected_.end(), 1);
+    return found == selected_.end() ? -1 : static_cast<int>(found - selected_.begin());
+}
+
+std::vector<int> UListCtrl::GetSelectedRows() const {
+    std::vector<int> rows;
+    for (int row = GetFirstSelected(); row >= 0; row = GetNextSelected(row)) rows.push_back(row);
+    return rows;
+}
+
+void UListCtrl::SetSelected(int row, bool selected) {
+    if (!InRange(row) || IsSelected(row) == selected) return;
+    selected_[static_cast<std::size_t>(row)] = selected ? 1 : 0;
+    NotifySelection();
+}
+
+void UListCtrl::SetSelection(const std::vector<int>& rows) {
+    std::vector<char> wanted(selected_.size(), 0);
+    for (const int row : rows) {
+        if (InRange(row)) wanted[static_cast<std::size_t>(row)] = 1;
+    }
+    if (wanted == selected_) return;
+    selected_ = std::move(wanted);
+    NotifySelection();
+}
+
+void UListCtrl::ClearSelection() {
+    SetSelection({});
+}
+
+void UListCtrl::SetFocusRow(int row) {
+    if (!InRange(row) || row == focus_) return;
+    focus_ = row;
+    NotifySelection();
+}
+
+void UListCtrl::SelectOnly(int row) {
+    std::fill(selected_.begin(), selected_.end(), 0);
+    if (InRange(row)) {
+        selected_[static_cast<std::size_t>(row)] = 1;
+        focus_ = anchor_ = row;
+    }
+}
+
+void UListCtrl::NotifySelection() {
+    if (events_ != nullptr) events_->SelectionChanged();
+}
+
+int UListCtrl::RunStart(int row) const {
+    while (row > 0 && IsSelected(row - 1)) --row;
+    return row;
+}
+
+int UListCtrl::RunEnd(int row) const {
+    while (IsSelected(row + 1)) ++row;
+    return row;
+}
+
+// ---- The form and the header ---------------------------------------------------------------
+
+int UListCtrl::ShowRecord(const std::wstring& text, int row) {
+    if (text.empty() || form_ == nullptr) return 0;
+    const int shown = form_->ShowRecord(text, row);
+    // The form takes the focus while it builds its fields; typing goes on in the list.
+    if (events_ != nullptr) events_->FocusList();
+    return shown;
+}
+
+int UListCtrl::UpdateHeader() {
+    if (rows_.empty()) return 0;
+    const int first = GetFirstSelected();
+    if (first < 0) return 1;
+    header_ = nedit::Format(L"Rec.No:%d", first);
+    if (events_ != nullptr) events_->HeaderChanged(header_);
+    return ShowRecord(GetItemText(first), first) == 1 ? 1 : 0;
+}
+
+void UListCtrl::MarkFormModified() {
+    if (form_ != nullptr) form_->SetModified();
+}
+
+// ---- Mouse ---------------------------------------------------------------------------------
+
+void UListCtrl::SelectRow(int row) {
+    if (!InRange(row)) return;
+    if (events_ != nullptr) events_->EnsureVisible(row);
+    OnLButtonDown(row);
+}
+
+void UListCtrl::OnLButtonDown(int row, bool ctrl, bool shift) {
+    // While a download adds rows the selection must not pull the form along.
+    if (IsAbortProcessOn()) return;
+    if (!InRange(row)) {
+        if (!ctrl) std::fill(selected_.begin(), selected_.end(), 0);
+    } else if (shift) {
+        const int from = InRange(anchor_) ? anchor_ : row;
+        if (!ctrl) std::fill(selected_.begin(), selected_.end(), 0);
+        for (int r = std::min(from, row); r <= std::max(from, row); ++r) {
+            selected_[static_cast<std::size_t>(r)] = 1;
+        }
+        focus_ = row;
+    } else if (ctrl) {
+        char& flag = selected_[static_cast<std::size_t>(row)];
+        flag = flag != 0 ? 0 : 1;
+        focus_ = anchor_ = row;
+    } else {
+        SelectOnly(row);
+    }
+    NotifySelection();
+    UpdateHeader();
+    HighlightRecordPoint();
+}
+
+void UListCtrl::OnLButtonDblClk(int row) {
+    if (IsAbortProcessOn()) return;
+    if (InRange(row)) {
+        SelectOnly(row);
+        NotifySelection();
+    }
+    const int first = GetFirstSelected();
+    if (first >= 0 && events_ != nullptr) events_->EditRecordRequested(GetItemText(first), first);
 }

@@ -1,44 +1,155 @@
 #pragma once
-// A raw-data document: the record-definition service for its records, the report
-// parameters, and the link to its job. (The storage of its records in the job comes with
-// the document's own operations.)
+// A raw-data document: one set of field observations inside a job. It is the record service
+// for its records, keeps their text in the "NeutralData" stream of its storage and its plan
+// settings in "Settings", owns the engine of its last reduction and the report, and holds the
+// report parameters.
+//
+// Decisions:
+// - A stored stream whose first line is no neutral-file header is still read row by row:
+//   the stream was written by this program, and its rows are the user's data.
+// - Reading a stream stops at its first empty line, as it always has; when text follows that
+//   line the user is told how many lines were not read, so nothing goes unnoticed.
 
+#include <memory>
 #include <string>
+#include <vector>
 
+#include "document/InputStack.h"
+#include "document/UNeditSettings.h"
+#include "platform/job/UDocument.h"
 #include "platform/job/UJobSettings.h"
+#include "platform/messages/ProgressSink.h"
 #include "records/UNeutralFileFormat.h"
 #include "report/NeditIni.h"
 #include "report/OutParamStruct.h"
 
+class UListCtrl;
+class UNeditDatabase;
+class UNeditReport;
 class USurveyDoc;
 
-class UNeditDoc : public UNeutralFileFormat {
+namespace nedit {
+class DialogHost;
+}
+
+class UNeditDoc : public UDocument, public UNeutralFileFormat {
 public:
-    /// A document of `job` (may be null: the defaults of a new job hold). Reads the report's
-    /// column flags from NEDIT.INI and takes the job's units as output units.
-    explicit UNeditDoc(USurveyDoc* job);
+    static constexpr const wchar_t* kNeutralDataStream = L"NeutralData";
+    static constexpr const wchar_t* kSettingsStream = L"Settings";
+
+    /// A document of `job` (may be null: the defaults of a new job hold). Loads the record
+    /// definition, reads the report's column flags from NEDIT.INI and takes the job's units.
+    explicit UNeditDoc(USurveyDoc* job, UDocument* parent = nullptr);
     ~UNeditDoc() override;
 
-    /// The report parameter of an option id (see OutParamStruct.h).
+    // ---- Storage --------------------------------------------------------------------------
+    /// Makes the document's storage in `container`; with CreateReport set also its report.
+    int CreateDocument(const std::wstring& name, UDocument* container) override;
+    /// Opens the document's storage in `container`, or makes it when it is not there.
+    int OpenDocument(const std::wstring& name, UDocument* container) override;
+    /// Reads the stored rows into `list` through its gate, and the plan settings. 0 without
+    /// a "NeutralData" stream, or when the settings cannot be read.
+    int Load(UListCtrl* list);
+    /// Writes the rows of `list` (or, without one, the text last read or written) into the
+    /// streams; the engine's adjusted points, or with `additionPoints` its addition points,
+    /// go into the list first. 0 when a stream cannot be written.
+    int Save(UListCtrl* list, int additionPoints);
+    /// The neutral export: every row and a line feed, UTF-8. 0 when the file cannot be written.
+    int Save(const std::wstring& path, const UListCtrl* list) const;
+    /// Saves the rows of the document's list, or its last text without one.
+    int SaveData() override;
+    /// Copies the stored text and the plan settings into `target`.
+    void CopyDocument(UNeditDoc& target);
+
+    /// The list of the open document: made and loaded on first use.
+    UListCtrl& OpenList();
+    UListCtrl* GetList() const { return List.get(); }
+
+    // ---- Reductions -------------------------------------------------------------------------
+    /// A new engine runs over the rows of `list`; addition points go back into the rows.
+    int SetupDataBase(UListCtrl* list);
+    /// A new engine runs over a neutral file, read into the document's list.
+    int SetupDataBase(const std::wstring& path);
+    /// Offers to clear the report, then SetupDataBase(list).
+    void Regenerate(UListCtrl* list);
+    UNeditDatabase* GetDatabase() const { return Database.get(); }
+    /// The text of a new record of that type: its key and the fields of its layout.
+    std::wstring FormRecBuf(int recordType) const;
+
+    // ---- Report and its parameters ------------------------------------------------------------
+    int CreateNReport();
+    void UpdateNReportTitle();
+    UNeditReport* GetNReport() const { return NReport.get(); }
+    void ClearReport();
     int GetCheckOn(int id) const { return ::GetCheckOn(OutputParameters, id); }
     OutParamStruct& GetOutputParameters() { return OutputParameters; }
     int GetPageSize() const { return OutputParameters.PageSize; }
     /// True when the job shows easting before northing.
     bool IsENOrder() const { return Settings.GetCoordinateOrder() == UJobSettings::kEastNorth; }
-    /// Takes the job's settings again, and its units as the report's output units.
+    /// Takes the job's settings again, its units as output units, and tells the report.
     void UpdateDisplaySettings();
 
+    // ---- Plain access ---------------------------------------------------------------------------
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
+    USurveyDoc* GetSurveyDocument() const override { return SurveyDoc; }
     const UJobSettings& GetSettings() const { return Settings; }
-    bool GetAbortProcess() const { return AbortProcess; }
-    void SetAbortProcess(bool abort) { AbortProcess = abort; }
+    UNeditSettings& GetNeditSettings() { return NeditSettings; }
+    const std::wstring& GetNeuText() const { return NeuText; }
+    const std::wstring& GetNeuFileName() const { return NeuFileName; }
+    void SetNeuFileName(const std::wstring& name) { NeuFileName = name; }
+    /// The host of the document's messages, and of its list's.
+    void SetDialogHost(nedit::DialogHost* host);
+    nedit::DialogHost* GetDialogHost() const { return Host; }
+    nedit::ProgressSink& GetProgress() { return Progress; }
+    bool GetAbortProcess() const { return Progress.AbortRequested(); }
+    void SetAbortProcess(bool abort);
+    bool GetAbortProcessOn() const { return AbortProcessOn; }
+    void SetAbortProcessOn(bool on) { AbortProcessOn = on; }
+    void SetCreateReport(bool create) { CreateReport = create; }
+
+    // ---- Interactive inputs and the command table -------------------------------------------
+    int Push(XInput* input);
+    XInput* Pop();
+    XInput* Top() const { return InputStack.empty() ? nullptr : InputStack.back(); }
+    int SetOption(XInputOption* option);
+    XInputOption* GetOption() const { return Option.get(); }
+    XInputOption* RemoveOption() { return Option.release(); }
+    int IsOptionActive() const { return Option != nullptr || Top() != nullptr; }
+    void SetModalOptionActive(int active) { ModalOptionActive = active; }
+    void OnAbortModalOption();
+    /// Commands for the inputs, with code 0: 1 when handled here, 0 for the base to handle.
+    /// `extra` carries a value in or out, as the command's kind says.
+    int OnCmdMsg(unsigned id, int code, void* extra);
 
 private:
     void TakeJobUnits();
+    int WriteSettingsStream();
+    void StartEngine(UListCtrl* list);
+    std::unique_ptr<UListCtrl> MakeList();
+    /// Process, then the rows that the run adds; CreateContent on success.
+    int RunEngine(UListCtrl* list);
 
     UJobSettings Settings;  // the job's, copied; the record service reads its units here
     USurveyDoc* SurveyDoc;
+    UDocument* ParentDoc;
+    nedit::DialogHost* Host = nullptr;
+    nedit::ProgressSink Progress;
+    std::wstring NeuText;
+    std::wstring NeuFileName;
+    std::unique_ptr<UListCtrl> List;
+    std::unique_ptr<UNeditDatabase> Database;
+    std::unique_ptr<UNeditReport> NReport;
     OutParamStruct OutputParameters;
+    UNeditSettings NeditSettings;
     nedit::NeditIniGuard IniGuard;
-    bool AbortProcess = false;
+    bool AbortProcessOn = false;
+    bool CreateReport = true;
+
+    std::vector<XInput*> InputStack;
+    std::unique_ptr<XInputOption> Option;
+    int ModalOptionActive = 0;
+    std::vector<unsigned> OptionIdsA;
+    std::vector<unsigned> OptionIdsB;
+    int OptionValueA = 0;
+    int OptionValueB = 0;
 };

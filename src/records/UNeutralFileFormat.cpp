@@ -137,6 +137,19 @@ int UNeutralFileFormat::GetFieldId(int type) const {
     return record != nullptr && record->single_field ? record->stands_for : 0;
 }
 
+bool UNeutralFileFormat::GetRecordTemplate(int type, std::wstring& text) const {
+    const RecordDefinition* record = definition_.RecordByType(type);
+    if (record == nullptr) return false;
+    text.clear();
+    for (const int id : record->fields) {
+        const FieldDefinition* field = definition_.FieldById(id);
+        if (field == nullptr) continue;
+        if (!text.empty()) text += L',';
+        text += field->key + L"=";
+    }
+    return true;
+}
+
 int UNeutralFileFormat::ProcessRecord(int type, const std::wstring& line, FieldMap& fields) {
     fields.clear();
     const RecordDefinition* record = definition_.RecordByType(type);

@@ -65,6 +65,10 @@ public:
     /// Gives 0, with `fields` empty, for an unknown type or a type without fields.
     int ProcessRecord(int type, const std::wstring& line, FieldMap& fields);
 
+    /// The template of a record type: its field keys, each with "=", joined by commas
+    /// ("ID=,HI=,CO=" for a station); empty for a single-field record. False for an unknown type.
+    bool GetRecordTemplate(int type, std::wstring& text) const;
+
     /// The record laid out in the standard way: the key padded to nine characters and a
     /// blank, then the fields separated by commas, blanks around "=" and "," removed.
     /// Values are not touched. A comment or an empty text is given back as it is.

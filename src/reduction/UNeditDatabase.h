@@ -201,6 +201,17 @@ public:
     int Check_In_LnList(const std::wstring& name) const;
     int SearchArc(const std::wstring& a, const std::wstring& b, const std::wstring& third, ArcType type) const;
 
+    // ---- Derived points back into the rows --------------------------------------------
+    /// Writes the adjusted points as XYZ rows behind the marker row, making the marker when
+    /// there is none. 1 when rows were written.
+    int SaveAdjustedPt2CtrlList(UListCtrl* list);
+    /// Writes the addition points (coordinates the user or the job gave) as XYZ rows in the
+    /// file's unit above the marker, replacing a row of the same name whose values differ.
+    int SaveAdditionPt2CtrlList(UListCtrl* list);
+    /// Forgets the adjusted points and deletes the rows from the lowest marker down.
+    void DelAdjPts();
+    void ClearAddPtList();
+
     const std::vector<UNeditPt>& GetPointList() const { return PointList; }
     const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList; }
     const std::vector<UNeditLine>& GetLineList() const { return LineList; }

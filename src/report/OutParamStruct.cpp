@@ -20,20 +20,26 @@ constexpr Column kColumns[] = {
     {L"NC", &OutParamStruct::OutNC, opt::NC}, {L"HC", &OutParamStruct::OutHC, opt::HC},
 };
 
+// The column of an option id, or null.
+const Column* ColumnOf(int id) {
+    for (const Column& column : kColumns) {
+        if (column.id == id) return &column;
+    }
+    return nullptr;
+}
+
 }  // namespace
 
 int* ColumnFlag(OutParamStruct& parameters, int id) {
-    for (const Column& column : kColumns) {
-        if (column.id == id) return &(parameters.*column.flag);
-    }
-    return nullptr;
+    const Column* column = ColumnOf(id);
+    return column != nullptr ? &(parameters.*column->flag) : nullptr;
 }
 
 int GetCheckOn(const OutParamStruct& parameters, int id) {
     if (id >= opt::AngleDms && id <= opt::AngleGons) return parameters.AngularUnit;
     if (id == opt::LengthMetres || id == opt::LengthFeet) return parameters.LinearUnit;
-    const int* flag = ColumnFlag(const_cast<OutParamStruct&>(parameters), id);
-    return flag != nullptr ? *flag : 0;
+    const Column* column = ColumnOf(id);
+    return column != nullptr ? parameters.*column->flag : 0;
 }
 
 void SetFlagsFromOrder(OutParamStruct& parameters, const std::wstring& order) {

@@ -122,6 +122,18 @@ chmod 444 "$SXNEDIT_CONFIG/NEDIT.INI"
 "$sxnedit" reduce "$work/small.neu" --report "$work/small.txt" >/dev/null 2>&1 && grep -q 'Occupied Station' "$work/small.txt" &&
     [ "$(stat -c %a "$SXNEDIT_CONFIG/NEDIT.INI")" = 444 ] && passed=$((passed + 1)) ||
     { echo "FAIL reduce-read-only-ini: no report or the file mode changed"; failed=$((failed + 1)); }
+# A document imported, reduced and exported gives back its rows with the point that the run
+# was given: the station nobody knew, at the entered values (0, 0, no height).
+"$sxnedit" job new "$work/docs.job" >/dev/null
+check doc-import 0 "" "" -- "$sxnedit" doc import "$work/docs.job" "$work/unknown.neu" --name "FIELD DAY"
+check doc-list 0 "$here/expected/doc_list.txt" "" -- "$sxnedit" doc list "$work/docs.job"
+"$sxnedit" doc reduce "$work/docs.job" "FIELD DAY" >/dev/null 2>&1
+"$sxnedit" doc export "$work/docs.job" "FIELD DAY" "$work/exported.neu"
+{ "$sxnedit" rows "$work/unknown.neu"; echo "XYZ       ID=K,E=0.000,N=0.000,H=-10000.000"; } >"$work/expected_rows"
+check doc-round-trip 0 "$work/expected_rows" "" -- cat "$work/exported.neu"
+check doc-rename-taken 1 /dev/null "sxnedit: the job has a document FIELD DAY already" -- "$sxnedit" doc rename "$work/docs.job" "FIELD DAY" "FIELD DAY"
+check doc-delete-missing 1 /dev/null "sxnedit: the job has no document NONE" -- "$sxnedit" doc delete "$work/docs.job" NONE
+check doc-usage 64 /dev/null "" -- "$sxnedit" doc export "$work/docs.job"
 check reduce-missing 2 /dev/null "sxnedit: Failed to open $work/none.neu." -- "$sxnedit" reduce "$work/none.neu"
 check reduce-no-file 64 /dev/null "" -- "$sxnedit" reduce --json
 

@@ -14,4 +14,5 @@ constexpr int Usage = 64;      // the command line itself is wrong
 
 int RunRows(const std::vector<std::string>& args);
 int RunReduce(const std::vector<std::string>& args);
+int RunDoc(const std::vector<std::string>& args);
 int RunJob(const std::vector<std::string>& args);

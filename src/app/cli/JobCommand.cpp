@@ -11,6 +11,7 @@
 #include "RecordSession.h"
 #include "platform/io/LineReader.h"
 #include "platform/job/Csv.h"
+#include "platform/settings/DataDirectory.h"
 #include "platform/job/UDBPoint.h"
 #include "platform/job/UDBSQLiteTransaction.h"
 #include "platform/job/USurveyDoc.h"
@@ -120,7 +121,7 @@ bool ReadCsvPoints(const std::string& file, std::vector<CsvPoint>& points, int& 
 int New(const std::string& path) {
     USvyCodeLib codes;
     std::wstring error;
-    if (!codes.LoadFile(DataDirectory() + "/SurveyCodes.csv", error)) {
+    if (!codes.LoadFile(nedit::DataDirectory() + "/SurveyCodes.csv", error)) {
         std::fprintf(stderr, "sxnedit: %s\n", nedit::ToUtf8(error).c_str());
         return exit_status::Failed;
     }

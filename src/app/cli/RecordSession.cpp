@@ -1,17 +1,17 @@
 #include "RecordSession.h"
 
 #include <cstdio>
-#include <cstdlib>
 
-#include "BuildInfo.h"
+#include "platform/settings/DataDirectory.h"
 #include "platform/text/WideText.h"
 #include "report/NeditIni.h"
 
 bool RecordSession::Start(USurveyDoc* job) {
-    nedit::InstallDefaultNeditIni(DataDirectory());
+    nedit::InstallDefaultNeditIni(nedit::DataDirectory());
     doc = std::make_unique<UNeditDoc>(job);
+    doc->SetDialogHost(&host);
     list = std::make_unique<UListCtrl>(doc.get());
-    if (doc->LoadNeutralFileDefinition(nedit::FromUtf8(DataDirectory()))) return true;
+    if (doc->IsKeysInitialised()) return true;
     std::fprintf(stderr, "sxnedit: the record definition could not be loaded: %s\n",
                  nedit::ToUtf8(doc->LastDefinitionError()).c_str());
     return false;
@@ -24,9 +24,4 @@ UNeditDatabase& RecordSession::StartEngine(bool withReport) {
         engine->SetReportPtr(report.get());
     }
     return *engine;
-}
-
-std::string DataDirectory() {
-    const char* configured = std::getenv("SXNEDIT_DATA_DIR");
-    return configured != nullptr && *configured != '\0' ? configured : SXNEDIT_DATA_DIR;
 }

@@ -14,9 +14,9 @@
 class USurveyDoc;
 
 struct RecordSession {
-    /// Installs the default NEDIT.INI when there is none, makes the document on `job` (may
-    /// be null) and loads the record definition; false, with a message on standard error,
-    /// when the definition cannot be loaded.
+    /// Installs the default NEDIT.INI when there is none and makes the document on `job` (may
+    /// be null); false, with a message on standard error, when the record definition cannot
+    /// be loaded.
     bool Start(USurveyDoc* job = nullptr);
     /// The engine, with the report when `withReport` is set.
     UNeditDatabase& StartEngine(bool withReport);
@@ -27,6 +27,3 @@ struct RecordSession {
     std::unique_ptr<UNeditReport> report;
     std::unique_ptr<UNeditDatabase> engine;
 };
-
-/// The directory holding the record definition: $SXNEDIT_DATA_DIR, else the build's data/.
-std::string DataDirectory();

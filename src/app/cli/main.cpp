@@ -30,6 +30,15 @@ const char* const kUsage =
     "  job export-points JOB FILE.csv\n"
     "                  write the job's points as such rows\n"
     "  job info JOB    the job's settings and what it holds\n"
+    "  doc list JOB    the raw-data documents stored in a job\n"
+    "  doc import JOB FILE.neu [--name NAME]\n"
+    "                  store a neutral file in the job as a raw-data document\n"
+    "  doc export JOB NAME FILE.neu\n"
+    "                  write a document's records as a neutral file\n"
+    "  doc reduce JOB NAME [--report OUT.txt|-] [--json]\n"
+    "                  reduce a stored document; coordinates that the run took from\n"
+    "                  the job or the user are added to its records\n"
+    "  doc rename JOB OLD NEW, doc delete JOB NAME\n"
     "  reduce FILE.neu [--job JOB] [--json] [--points OUT.csv] [--interactive]\n"
     "         [--report OUT.txt|-] [--angles dms|deg|gon] [--lengths m|ft|usft]\n"
     "         [--columns ID,LN,HA,VA,SD,HD,VD,HT,CO,EC,NC,HC]\n"
@@ -70,6 +79,7 @@ int Dispatch(const std::vector<std::string>& words) {
     if (command == "rows") return RunRows(args);
     if (command == "job") return RunJob(args);
     if (command == "reduce") return RunReduce(args);
+    if (command == "doc") return RunDoc(args);
     std::fprintf(stderr, "sxnedit: unknown command '%s' (see sxnedit --help)\n", command.c_str());
     return exit_status::Usage;
 }

@@ -1,0 +1,140 @@
+#include "document/URawDataContainer.h"
+
+#include <algorithm>
+
+#include "platform/io/LineReader.h"
+#include "platform/job/USurveyDoc.h"
+#include "platform/storage/UStreamFile.h"
+#include "platform/text/Format.h"
+#include "platform/text/WideText.h"
+
+namespace {
+constexpr unsigned kCreateMode = 4113;
+}
+
+URawDataContainer::URawDataContainer(USurveyDoc* job) : Job(job) {}
+
+URawDataContainer::~URawDataContainer() = default;
+
+int URawDataContainer::Open() { return OpenDocument(kStorageName, Job); }
+
+int URawDataContainer::OpenDocument(const std::wstring& name, UDocument* job) {
+    Documents.clear();
+    if (!UDocument::OpenDocument(name, job)) {
+        if (!UDocument::CreateDocument(name, job) || !Commit()) return 0;
+    }
+    for (const UStorageElement& element : GetStorage()->EnumElements()) {
+        if (element.Type != UStorageElement::kStorage) continue;
+        auto doc = std::make_unique<UNeditDoc>(Job);
+        if (doc->OpenDocument(element.Name, this)) Adopt(std::move(doc));
+    }
+    return 1;
+}
+
+UNeditDoc* URawDataContainer::Adopt(std::unique_ptr<UNeditDoc> doc) {
+    Documents.push_back(std::move(doc));
+    return Documents.back().get();
+}
+
+UNeditDoc* URawDataContainer::GetNeditDoc(const std::wstring& name) const {
+    for (const auto& doc : Documents) {
+        if (doc->GetName() == name) return doc.get();
+    }
+    return nullptr;
+}
+
+std::vector<std::wstring> URawDataContainer::GetDocumentNames() const {
+    std::vector<std::wstring> names;
+    for (const auto& doc : Documents) names.push_back(doc->GetName());
+    return names;
+}
+
+std::set<std::wstring> URawDataContainer::TakenNames() const {
+    std::set<std::wstring> taken;
+    for (const auto& doc : Documents) taken.insert(doc->GetName());
+    if (storage_.IsOpen()) {
+        for (const UStorageElement& element : storage_.EnumElements()) taken.insert(element.Name);
+    }
+    return taken;
+}
+
+std::wstring URawDataContainer::GetUntitledName() const {
+    const std::set<std::wstring> taken = TakenNames();
+    int number = 1;
+    while (number < kNameLimit - 1 && taken.count(nedit::Format(L"Data%d", number)) != 0) ++number;
+    return nedit::Format(L"Data%d", number);
+}
+
+int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseName, const std::wstring& path,
+                                                     std::wstring* createdName) {
+    const std::wstring base = baseName.empty() ? std::wstring(L"Data") : baseName;
+    const std::set<std::wstring> taken = TakenNames();
+    int number = 1;
+    while (number < kNameLimit && taken.count(nedit::Format(L"%s%d", base, number)) != 0) ++number;
+    if (number >= kNameLimit || GetStorage() == nullptr) return 0;
+    const std::wstring name = nedit::Format(L"%s%d", base, number);
+
+    nedit::LineReader reader;
+    if (!reader.Open(nedit::ToUtf8(path))) return 0;
+    UStorage storage;
+    if (!storage.Create(*GetStorage(), name, 69650)) return 0;
+    UStreamFile stream;
+    if (!stream.CreateStream(storage, UNeditDoc::kNeutralDataStream, kCreateMode)) {
+        storage.Release();
+        return 0;
+    }
+    for (std::string line; reader.ReadLine(line);) {
+        if (nedit::TrimView(nedit::DecodeTextLine(line)).empty()) continue;
+        stream.Write(line.data(), line.size());
+        stream.Write("\n", 1);
+    }
+    stream.Close();
+    UStreamFile settings;
+    if (settings.CreateStream(storage, UNeditDoc::kSettingsStream, kCreateMode)) {
+        const std::string bytes = UNeditSettings().Write();
+        settings.Write(bytes.data(), bytes.size());
+        settings.Close();
+    }
+    if (!storage.Commit() || !Commit(2)) return 0;
+    storage.Release();
+
+    auto doc = std::make_unique<UNeditDoc>(Job);
+    if (!doc->OpenDocument(name, this)) return 0;
+    Adopt(std::move(doc));
+    if (createdName != nullptr) *createdName = name;
+    return 1;
+}
+
+bool URawDataContainer::DeleteNeditDoc(const std::wstring& name) {
+    const auto found = std::find_if(Documents.begin(), Documents.end(),
+                                    [&name](const auto& doc) { return doc->GetName() == name; });
+    if (found == Documents.end()) return false;
+    (*found)->CloseDocument();
+    Documents.erase(found);
+    return Delete(name) && Commit();
+}
+
+bool URawDataContainer::RenameNeditDoc(const std::wstring& newName, const std::wstring& oldName, int /*flag*/) {
+    if (GetNeditDoc(newName) != nullptr) return false;
+    UNeditDoc* old_doc = GetNeditDoc(oldName);
+    if (old_doc == nullptr) return false;
+    if (old_doc->GetModified()) old_doc->SaveData();
+    auto renamed = std::make_unique<UNeditDoc>(Job);
+    renamed->SetCreateReport(false);
+    if (!renamed->CreateDocument(newName, this)) return false;
+    old_doc->CopyDocument(*renamed);
+    if (!renamed->SaveAsDocument(newName)) return false;
+    Adopt(std::move(renamed));
+    return DeleteNeditDoc(oldName) && Commit();
+}
+
+void URawDataContainer::CopyDocument(URawDataContainer& target, USurveyDoc* targetSurvey) {
+    for (const auto& doc : Documents) {
+        auto copy = std::make_unique<UNeditDoc>(targetSurvey);
+        copy->SetCreateReport(false);
+        if (!copy->CreateDocument(doc->GetName(), &target)) continue;
+        doc->CopyDocument(*copy);
+        if (copy->SaveAsDocument(doc->GetName())) target.Adopt(std::move(copy));
+    }
+    target.Commit();
+}

@@ -1,0 +1,55 @@
+#pragma once
+// All raw-data documents of a job: one child storage each, under the storage "RawData" of
+// the job file.
+
+#include <memory>
+#include <set>
+#include <string>
+#include <vector>
+
+#include "document/UNeditDoc.h"
+#include "platform/job/UDocument.h"
+
+class USurveyDoc;
+
+class URawDataContainer : public UDocument {
+public:
+    static constexpr const wchar_t* kStorageName = L"RawData";
+    /// Names are "Data%d" and the like; no number reaches this.
+    static constexpr int kNameLimit = 1024;
+
+    explicit URawDataContainer(USurveyDoc* job);
+    ~URawDataContainer() override;
+
+    /// Opens the container's storage in the job, making it when the job has none yet, and
+    /// makes a document for every child storage. 0 when the job cannot give it.
+    int OpenDocument(const std::wstring& name, UDocument* job) override;
+    /// The open container of `job`.
+    int Open();
+
+    UNeditDoc* GetNeditDoc(const std::wstring& name) const;
+    /// The names of the documents, in the order of their storages.
+    std::vector<std::wstring> GetDocumentNames() const;
+    /// "Data%d" with the lowest free number from 1; the search ends at 1023.
+    std::wstring GetUntitledName() const;
+    /// Makes a document of a neutral file (UTF-8) named `baseName` with the lowest free
+    /// number from 1 behind it ("Data" when empty). Blank lines of the file are left out: a
+    /// blank line would end the stored records when they are read back. 0 when no name is
+    /// free below 1024, or the file or the storage cannot be had.
+    int CreateNEditDocFromNeutralFile(const std::wstring& baseName, const std::wstring& path,
+                                      std::wstring* createdName = nullptr);
+    bool DeleteNeditDoc(const std::wstring& name);
+    /// Gives the document `oldName` the name `newName`; false when `newName` is taken or
+    /// `oldName` does not exist.
+    bool RenameNeditDoc(const std::wstring& newName, const std::wstring& oldName, int flag = 0);
+    /// Copies every document into `target`, a container of `targetSurvey`.
+    void CopyDocument(URawDataContainer& target, USurveyDoc* targetSurvey);
+
+private:
+    /// The names of the documents and of every element of the container's storage.
+    std::set<std::wstring> TakenNames() const;
+    UNeditDoc* Adopt(std::unique_ptr<UNeditDoc> doc);
+
+    USurveyDoc* Job;
+    std::vector<std::unique_ptr<UNeditDoc>> Documents;
+};

@@ -1,0 +1,81 @@
+// Points that the engine derived and that must outlive the run go back into the record
+// list as ordinary rows: adjusted points below the marker row, addition points above it.
+
+#include "document/UListCtrl.h"
+#include "platform/geometry/Tolerance.h"
+#include "platform/text/Format.h"
+#include "platform/text/WideText.h"
+#include "records/RecordTypes.h"
+#include "reduction/UNeditDatabase.h"
+
+namespace {
+
+// The lowest marker row: the list is searched from its last row upward.
+int FindMarker(const UListCtrl& list) {
+    for (int row = list.GetItemCount() - 1; row >= 0; --row) {
+        if (nedit::ToUpper(nedit::TrimView(list.GetItemText(row))) == kAdjustedPointsMarker) return row;
+    }
+    return -1;
+}
+
+}  // namespace
+
+int UNeditDatabase::SaveAdjustedPt2CtrlList(UListCtrl* list) {
+    if (list == nullptr || list->GetItemCount() == 0 || TravPtList.empty()) return 0;
+    const int count = list->GetItemCount();
+    int marker = FindMarker(*list);
+    if (marker < 0) {
+        list->AddRecord(count, kAdjustedPointsMarker);
+        marker = count;
+    }
+    int row = marker + 1;
+    // Working values, as the adjustment left them; rows below the marker are overwritten
+    // one for one and rows past the last one written stay.
+    for (const UNeditPt& point : TravPtList) {
+        const std::wstring text =
+            nedit::Format(L"%-10s ID=%s,E=%.3f,N=%.3f,H=%.3f", L"XYZ", point.GetID(), point.x, point.y, point.z);
+        if (row < count) {
+            list->SetRecord(row, text);
+        } else {
+            list->AddRecord(row, text);
+        }
+        ++row;
+    }
+    return 1;
+}
+
+int UNeditDatabase::SaveAdditionPt2CtrlList(UListCtrl* list) {
+    if (list == nullptr || list->GetItemCount() == 0 || AddPtList.empty()) return 0;
+    const int marker = FindMarker(*list);
+    int insert_at = marker >= 0 ? marker : list->GetItemCount();
+    UListCtrl* const saved = ListCtrl;
+    ListCtrl = list;  // FindXYZ reads the list being written
+    for (const UNeditPt& point : AddPtList) {
+        double e = 0.0, n = 0.0, h = 0.0;
+        const int row = FindXYZ(point.GetID(), e, n, h);
+        const std::wstring text = FormatXYZRecord(point.GetID(), point.x, point.y, point.z);
+        if (row < 0) {
+            list->AddRecord(insert_at++, text);
+        } else if (!Is_Zero(point.x - e, false) || !Is_Zero(point.y - n, false) || !Is_Zero(point.z - h, false)) {
+            list->DeleteItem(row);
+            list->AddRecord(row, text);
+        }
+    }
+    ListCtrl = saved;
+    return 1;
+}
+
+void UNeditDatabase::DelAdjPts() {
+    if (TravPtList.empty()) return;
+    TravPtList.clear();
+    TravPtIndex.Clear();
+    if (ListCtrl == nullptr || ListCtrl->GetItemCount() == 0) return;
+    const int marker = FindMarker(*ListCtrl);
+    if (marker < 0) return;
+    while (ListCtrl->GetItemCount() > marker) ListCtrl->DeleteItem(ListCtrl->GetItemCount() - 1);
+}
+
+void UNeditDatabase::ClearAddPtList() {
+    AddPtList.clear();
+    AddPtIndex.Clear();
+}
