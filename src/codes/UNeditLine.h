@@ -3,10 +3,11 @@
 
 #include <string>
 
+#include "codes/UNeditLinework.h"
 #include "codes/UNeditPt.h"
 #include "platform/geometry/UWLine.h"
 
-class UNeditLine : public UWLine {
+class UNeditLine : public UWLine, public UNeditLinework {
 public:
     UNeditLine() = default;
     /// From `from` to `to`, with their coordinates and names.
@@ -20,27 +21,9 @@ public:
     void SetStationLine(int value) { StationLine = value; }
     const std::wstring& GetFromPt() const { return FromPt; }
     const std::wstring& GetToPt() const { return ToPt; }
-    int GetColor() const { return Color; }
-    void SetColor(int color) { Color = color; }
-    const std::wstring& GetLayer() const { return Layer; }
-    void SetLayer(const std::wstring& layer) { Layer = layer; }
-    int GetLineType() const { return LineType; }
-    void SetLineType(int type) { LineType = type; }
-    int GetThickness() const { return Thickness; }
-    void SetThickness(int thickness) { Thickness = thickness; }
-    const std::wstring& GetCode() const { return Code; }
-    void SetCode(const std::wstring& code) { Code = code; }
-    const std::wstring& GetStringNo() const { return StringNo; }
-    void SetStringNo(const std::wstring& name) { StringNo = name; }
 
 private:
     int StationLine = 0;
     std::wstring FromPt;
     std::wstring ToPt;
-    int Color = 15;
-    std::wstring Layer;
-    int LineType = 0;
-    int Thickness = 0;
-    std::wstring Code;
-    std::wstring StringNo;
 };

@@ -2,9 +2,9 @@
 // An arc of the job through three of its points. ArcType bit 0 set: the third point lies on
 // the arc; clear: it is the centre. Bit 1 is the sense bit.
 
-#include "platform/job/UDBObject.h"
+#include "platform/job/UDBLinework.h"
 
-class UDBArc : public UDBObject {
+class UDBArc : public UDBLinework {
   public:
     explicit UDBArc(USurveyDoc* job, long id = 0);
 
@@ -23,10 +23,6 @@ class UDBArc : public UDBObject {
     }
     int GetArcType() const { return arc_type_; }
     void SetArcType(int type) { arc_type_ = type; }
-    int GetLineStyle() const { return line_style_; }
-    void SetLineStyle(int style) { line_style_ = style; }
-    int GetThickness() const { return thickness_; }
-    void SetThickness(int thickness) { thickness_ = thickness; }
 
   protected:
     const char* AreaQuery() const override;
@@ -36,6 +32,4 @@ class UDBArc : public UDBObject {
     long end_ = 0;
     long third_ = 0;
     int arc_type_ = 0;
-    int line_style_ = 0;
-    int thickness_ = 0;
 };

@@ -1,9 +1,9 @@
 #pragma once
 // A circle of the job about one of its points.
 
-#include "platform/job/UDBObject.h"
+#include "platform/job/UDBLinework.h"
 
-class UDBCircle : public UDBObject {
+class UDBCircle : public UDBLinework {
   public:
     explicit UDBCircle(USurveyDoc* job, long id = 0);
 
@@ -16,10 +16,6 @@ class UDBCircle : public UDBObject {
     void SetCentreId(long centre) { centre_ = centre; }
     double GetRadius() const { return radius_; }
     void SetRadius(double radius) { radius_ = radius; }
-    int GetLineStyle() const { return line_style_; }
-    void SetLineStyle(int style) { line_style_ = style; }
-    int GetThickness() const { return thickness_; }
-    void SetThickness(int thickness) { thickness_ = thickness; }
 
   protected:
     const char* AreaQuery() const override;
@@ -27,6 +23,4 @@ class UDBCircle : public UDBObject {
   private:
     long centre_ = 0;
     double radius_ = 0.0;
-    int line_style_ = 0;
-    int thickness_ = 0;
 };

@@ -2,9 +2,9 @@
 // A line of the job between two of its points, with layer, colour, line style, thickness and
 // flags.
 
-#include "platform/job/UDBObject.h"
+#include "platform/job/UDBLinework.h"
 
-class UDBLine : public UDBObject {
+class UDBLine : public UDBLinework {
   public:
     /// A line of the job; with an identifier other than 0 it is loaded.
     explicit UDBLine(USurveyDoc* job, long id = 0);
@@ -20,10 +20,6 @@ class UDBLine : public UDBObject {
         start_ = start;
         end_ = end;
     }
-    int GetLineStyle() const { return line_style_; }
-    void SetLineStyle(int style) { line_style_ = style; }
-    int GetThickness() const { return thickness_; }
-    void SetThickness(int thickness) { thickness_ = thickness; }
 
   protected:
     const char* AreaQuery() const override;
@@ -31,6 +27,4 @@ class UDBLine : public UDBObject {
   private:
     long start_ = 0;
     long end_ = 0;
-    int line_style_ = 0;
-    int thickness_ = 0;
 };

@@ -7,7 +7,7 @@
 
 // ---- UDBLine ---------------------------------------------------------------------------
 
-UDBLine::UDBLine(USurveyDoc* job, long id) : UDBObject(job, nedit::kLineKind, "line") {
+UDBLine::UDBLine(USurveyDoc* job, long id) : UDBLinework(job, nedit::kLineKind, "line") {
     if (id != 0) Load(id);
 }
 
@@ -57,7 +57,7 @@ const char* UDBLine::AreaQuery() const {
 
 // ---- UDBArc ----------------------------------------------------------------------------
 
-UDBArc::UDBArc(USurveyDoc* job, long id) : UDBObject(job, nedit::kArcKind, "arc") {
+UDBArc::UDBArc(USurveyDoc* job, long id) : UDBLinework(job, nedit::kArcKind, "arc") {
     if (id != 0) Load(id);
 }
 
@@ -110,7 +110,7 @@ const char* UDBArc::AreaQuery() const {
 
 // ---- UDBCircle -------------------------------------------------------------------------
 
-UDBCircle::UDBCircle(USurveyDoc* job, long id) : UDBObject(job, nedit::kCircleKind, "circle") {
+UDBCircle::UDBCircle(USurveyDoc* job, long id) : UDBLinework(job, nedit::kCircleKind, "circle") {
     if (id != 0) Load(id);
 }
 
