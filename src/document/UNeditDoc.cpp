@@ -197,6 +197,7 @@ int UNeditDoc::SetupDataBase(const std::wstring& path) {
 void UNeditDoc::StartEngine(UListCtrl* list) {
     Database = std::make_unique<UNeditDatabase>(this, list, SurveyDoc, Host, &Progress, L"*CHK");
     Database->SetReportPtr(NReport.get());
+    Database->SetFileName(NeuFileName);  // the bearing store lies beside the neutral file
 }
 
 int UNeditDoc::RunEngine(UListCtrl* list) {

@@ -70,15 +70,12 @@ void UNeditDatabase::ResetPassValues() {
 
 int UNeditDatabase::PrepareRows(const std::vector<std::wstring>& rows) {
     ResetPassValues();
+    DeleteList();
     // Every row may name a station or a point: room for all of them up front spares the
     // name tables their rehashing as a large survey fills them.
     StationsByName.Reserve(rows.size());
     PointIndex.Reserve(rows.size());
     PointList.reserve(rows.size());
-    CurStn = nullptr;
-    PendingStn.reset();
-    Stations.clear();
-    StationsByName.Clear();
     TravFlag = 0;
     const std::size_t count = rows.size();
     std::wstring normalised;
@@ -301,8 +298,11 @@ void UNeditDatabase::ProcessObservation(int type, int recordNo) {
         CurStn->BkStnGiven = 1;
         return;
     }
+    // A target observed again already holds the names filed before its first observation:
+    // the names filed since then join them.
     if (CurPtNames) {
-        StnPtNames.emplace(inserted, std::move(*CurPtNames));
+        std::vector<std::wstring>& names = StnPtNames[inserted];
+        names.insert(names.end(), CurPtNames->begin(), CurPtNames->end());
         CurPtNames.reset();
     }
     if (CurChkList) {

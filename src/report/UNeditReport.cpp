@@ -60,7 +60,6 @@ UNeditReport::~UNeditReport() = default;
 void UNeditReport::Init(UNeditDoc* doc, const std::wstring& title) {
     SetReportTitle(title);
     Doc = doc;
-    JobSettings.reset();
     EdmScale = 1.0;
     EdmType = L'0';
     OutUA = L'S';
@@ -113,14 +112,12 @@ std::wstring UNeditReport::Unit_Text(const std::wstring& section, wchar_t letter
     return IniValue(section, std::wstring(1, letter));
 }
 
-const UJobSettings& UNeditReport::Settings() {
-    if (!JobSettings) {
-        JobSettings = std::make_unique<UJobSettings>(Doc != nullptr ? Doc->GetSettings() : UJobSettings());
-    }
-    return *JobSettings;
+const UJobSettings& UNeditReport::Settings() const {
+    static const UJobSettings kDefaults;
+    return Doc != nullptr ? Doc->GetSettings() : kDefaults;
 }
 
-double UNeditReport::ToMetres(double length) {
+double UNeditReport::ToMetres(double length) const {
     return nedit::ConvertLength(length, Settings().GetLengthUnit(), nedit::LengthUnit::Metres);
 }
 
@@ -175,10 +172,7 @@ double UNeditReport::dms(double degrees) {
     return degrees < 0.0 ? -result : result;
 }
 
-bool UNeditReport::Sexagesimal() const {
-    if (Doc != nullptr) return Doc->GetCheckOn(opt::AngleDms) == 0;
-    return OutUA != L'1' && OutUA != L'2' && OutUA != L'D' && OutUA != L'G';
-}
+bool UNeditReport::Sexagesimal() const { return AngleType() == 0; }
 
 std::wstring UNeditReport::dmsString(double value) const {
     // The digits are taken from the value rounded to four places as a whole number: taking

@@ -112,16 +112,15 @@ private:
     bool IsOn(int option) const;
     int AngleType() const;
     bool Sexagesimal() const;
-    /// The job's settings, copied on first need; defaults without a job.
-    const UJobSettings& Settings();
+    /// The document's job settings, as they are now; defaults without a document.
+    const UJobSettings& Settings() const;
     /// Metres of a stored length in the job's unit.
-    double ToMetres(double length);
+    double ToMetres(double length) const;
     std::wstring IniValue(const std::wstring& section, const std::wstring& key) const;
     /// East and North texts in the order of XYFlag.
     std::pair<std::wstring, std::wstring> InOrder(std::wstring east, std::wstring north) const;
 
     UNeditDoc* Doc = nullptr;
-    std::unique_ptr<UJobSettings> JobSettings;
     double EdmScale = 1.0;
     wchar_t EdmType = L'0';
     wchar_t OutUA = L'S';

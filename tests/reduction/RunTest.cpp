@@ -43,3 +43,16 @@ TEST(RunErrors, TheErrorTableNamesEachCode) {
     EXPECT_EQ(CError::MessageOf(1), L"Default Error Has Occurred!!!!");
     EXPECT_EQ(CError::MessageOf(-1), L"Default Error Has Occurred!!!!");
 }
+
+TEST_F(ReductionRun, ASecondRunOnOneEngineGivesTheSameResult) {
+    Rows(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nPT ID=K1,E=1,N=2,H=3\nSTN ID=A,HI=1.5\n"
+         L"XYZ ID=A,E=0,N=0,H=0\nBKB ID=B,BRG=0,HA=0\nSS ID=P,HA=90,VA=90,SD=10,HT=1.5\n"
+         L"PT ID=K2,E=5,N=5,H=5\nSS ID=P,HA=90,VA=90,SD=12,HT=1.5\n");
+    ASSERT_EQ(engine.Process(), 1);
+    const UNeditPt first = Point(L"P");
+    ASSERT_EQ(engine.Process(), 1);
+    // Two measurements of P: a mean distance of 11 m, East of A.
+    EXPECT_DOUBLE_EQ(Point(L"P").x, first.x);
+    EXPECT_NEAR(first.x, 11.0, 1e-9);
+    EXPECT_EQ(engine.GetStations().size(), 2u);  // A and the point-only node of P
+}

@@ -14,9 +14,7 @@
 #include "platform/job/USurveyDoc.h"
 #include "platform/settings/DataDirectory.h"
 #include "platform/text/WideText.h"
-#include "reduction/UNeditDatabase.h"
 #include "report/NeditIni.h"
-#include "report/UNeditReport.h"
 
 namespace {
 
@@ -103,6 +101,7 @@ int Reduce(OpenJob& open, const std::vector<std::string>& args) {
             return exit_status::Usage;
         }
     }
+    if (!CheckOutputOptions(report, json)) return exit_status::Usage;
     UNeditDoc* doc = Find(open, args[1]);
     if (doc == nullptr) return exit_status::Failed;
     open.host.SetEcho(!json);
@@ -110,19 +109,9 @@ int Reduce(OpenJob& open, const std::vector<std::string>& args) {
     const int result = doc->SetupDataBase(&list);
     // Addition points went into the rows; they are kept with the document.
     doc->SaveDocument();
-    if (report == "-") {
-        std::string text = nedit::ToUtf8(doc->GetNReport()->GetText());
-        if (!text.empty() && text.back() != '\n') text += '\n';
-        std::fputs(text.c_str(), stdout);
-    } else if (!report.empty() && !doc->GetNReport()->SaveAsText(report)) {
-        std::fprintf(stderr, "sxnedit: cannot write %s\n", report.c_str());
+    if (!WriteReductionOutput(*doc->GetDatabase(), doc->GetNReport(), report, json, open.host.Messages(),
+                              doc->GetSettings().GetLengthDecimals())) {
         return exit_status::Failed;
-    }
-    if (json) {
-        PrintJson(*doc->GetDatabase(), open.host.Messages());
-    } else if (report != "-") {
-        std::fputs(PointsTable(ReducedPoints(*doc->GetDatabase()), doc->GetSettings().GetLengthDecimals()).c_str(),
-                   stdout);
     }
     return result == 1 ? exit_status::Ok : exit_status::Failed;
 }

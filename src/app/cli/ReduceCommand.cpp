@@ -88,11 +88,7 @@ bool ParseOptions(const std::vector<std::string>& args, ReduceOptions& options) 
         std::fprintf(stderr, "sxnedit: reduce needs a neutral file (see sxnedit --help)\n");
         return false;
     }
-    if (options.json && options.report == "-") {
-        std::fprintf(stderr, "sxnedit: reduce: --json and --report - both want standard output\n");
-        return false;
-    }
-    return true;
+    return CheckOutputOptions(options.report, options.json);
 }
 
 }  // namespace
@@ -128,19 +124,9 @@ int RunReduce(const std::vector<std::string>& args) {
         return exit_status::Unreadable;
     }
     const int result = engine.Process();
-    if (options.report == "-") {
-        std::string text = nedit::ToUtf8(session.report->GetText());
-        if (!text.empty() && text.back() != '\n') text += '\n';
-        std::fputs(text.c_str(), stdout);
-    } else if (!options.report.empty() && !session.report->SaveAsText(options.report)) {
-        std::fprintf(stderr, "sxnedit: cannot write %s\n", options.report.c_str());
+    if (!WriteReductionOutput(engine, session.report.get(), options.report, options.json, session.host.Messages(),
+                              session.doc->GetSettings().GetLengthDecimals())) {
         return exit_status::Failed;
-    }
-    if (options.json) {
-        PrintJson(engine, session.host.Messages());
-    } else if (options.report != "-") {
-        const std::string table = PointsTable(ReducedPoints(engine), session.doc->GetSettings().GetLengthDecimals());
-        std::fputs(table.c_str(), stdout);
     }
     if (!options.points_csv.empty() && !WritePointsCsv(options.points_csv, ReducedPoints(engine))) {
         return exit_status::Failed;

@@ -3,7 +3,9 @@
 #include <cstdio>
 
 #include "Json.h"
+#include "platform/text/WideText.h"
 #include "reduction/UNeditDatabase.h"
+#include "report/UNeditReport.h"
 
 std::vector<PointRow> ReducedPoints(const UNeditDatabase& engine) {
     std::vector<PointRow> points;
@@ -49,3 +51,27 @@ void PrintJson(const UNeditDatabase& engine, const std::vector<std::wstring>& me
     std::fputs(out.c_str(), stdout);
 }
 
+
+bool CheckOutputOptions(const std::string& reportPath, bool json) {
+    if (!json || reportPath != "-") return true;
+    std::fprintf(stderr, "sxnedit: --json and --report - both want standard output\n");
+    return false;
+}
+
+bool WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report, const std::string& reportPath,
+                          bool json, const std::vector<std::wstring>& messages, int decimals) {
+    if (report != nullptr && reportPath == "-") {
+        std::string text = nedit::ToUtf8(report->GetText());
+        if (!text.empty() && text.back() != '\n') text += '\n';
+        std::fputs(text.c_str(), stdout);
+    } else if (report != nullptr && !reportPath.empty() && !report->SaveAsText(reportPath)) {
+        std::fprintf(stderr, "sxnedit: cannot write %s\n", reportPath.c_str());
+        return false;
+    }
+    if (json) {
+        PrintJson(engine, messages);
+    } else if (reportPath != "-") {
+        std::fputs(PointsTable(ReducedPoints(engine), decimals).c_str(), stdout);
+    }
+    return true;
+}
