@@ -72,8 +72,8 @@ unsigned UNeditDatabase::SaveTravPoint(const std::wstring& name, double x, doubl
 int UNeditDatabase::SaveLine(unsigned from, unsigned to, int stationLine) {
     constexpr unsigned kNone = static_cast<unsigned>(-1);
     if (from == kNone || to == kNone || from >= PointList.size() || to >= PointList.size()) return 0;
-    const UNeditPt start = PointList[from];
-    const UNeditPt end = PointList[to];
+    const UNeditPt& start = PointList[from];
+    const UNeditPt& end = PointList[to];
     const int existing = GetLineIdx(start.GetID(), end.GetID());
     // An existing line keeps its direction.
     const bool forward = existing < 0 || LineList[static_cast<std::size_t>(existing)].GetFromPt() == start.GetID();

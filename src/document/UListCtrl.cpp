@@ -30,9 +30,9 @@ int UListCtrl::AddRecord(int row, const std::wstring& text) {
     std::wstring normalised = NormaliseRecord(text);
     if (normalised.empty()) return -1;
     if (row < 0 || row > GetItemCount()) row = GetItemCount();
-    InsertRows(row, {normalised});
+    InsertRow(row, std::move(normalised));
     // A download adds a row at a time; rebuilding the form for each would only slow it.
-    if (form_ != nullptr && !IsAbortProcessOn()) ShowRecord(normalised, row);
+    if (form_ != nullptr && !IsAbortProcessOn()) ShowRecord(rows_[static_cast<std::size_t>(row)], row);
     return row;
 }
 
@@ -68,10 +68,18 @@ void UListCtrl::Reserve(std::size_t rows) {
 
 void UListCtrl::InsertRows(int row, std::vector<std::wstring> texts) {
     if (texts.empty()) return;
-    const int count = static_cast<int>(texts.size());
     rows_.insert(rows_.begin() + row, std::make_move_iterator(texts.begin()),
                  std::make_move_iterator(texts.end()));
-    selected_.insert(selected_.begin() + row, texts.size(), 0);
+    RowsAdded(row, static_cast<int>(texts.size()));
+}
+
+void UListCtrl::InsertRow(int row, std::wstring text) {
+    rows_.insert(rows_.begin() + row, std::move(text));
+    RowsAdded(row, 1);
+}
+
+void UListCtrl::RowsAdded(int row, int count) {
+    selected_.insert(selected_.begin() + row, static_cast<std::size_t>(count), 0);
     // Focus and anchor stay on the rows they were on, which have moved down.
     if (focus_ >= row) focus_ += count;
     if (anchor_ >= row) anchor_ += count;

@@ -228,6 +228,9 @@ class UListCtrl {
     bool InRange(int row) const { return row >= 0 && row < GetItemCount(); }
     /// Inserts rows as they are, unselected, keeping selection and focus on their rows.
     void InsertRows(int row, std::vector<std::wstring> texts);
+    void InsertRow(int row, std::wstring text);
+    /// Selection, focus and listeners follow `count` rows put in at `row`.
+    void RowsAdded(int row, int count);
     /// Removes `count` rows from `row` on.
     void RemoveRows(int row, int count);
     void ReplaceRow(int row, std::wstring text);

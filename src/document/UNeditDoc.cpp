@@ -10,7 +10,7 @@
 #include "platform/storage/UStreamFile.h"
 #include "platform/text/Format.h"
 #include "platform/text/WideText.h"
-#include "records/RecordText.h"
+#include "records/NamelessCoordinates.h"
 #include "records/RecordTypes.h"
 #include "reduction/UNeditDatabase.h"
 #include "report/UNeditReport.h"
@@ -18,12 +18,6 @@
 namespace {
 
 constexpr const wchar_t* kReportTitle = L"Raw Data Reduction Report";
-// Stream modes: exclusive read-write to read, create-exclusive-write to write.
-constexpr unsigned kReadMode = 18;
-constexpr unsigned kCreateMode = 4113;
-
-// A coordinate record with at most two commas carries no name of its own.
-bool LacksOwnId(const std::wstring& row) { return nedit::CountOf(row, L',') <= 2; }
 
 }  // namespace
 
@@ -67,7 +61,7 @@ int UNeditDoc::Load(UListCtrl* list) {
     UStreamFile stream;
     if (list == nullptr || storage == nullptr || !stream.OpenStream(*storage, kNeutralDataStream, kReadMode)) return 0;
     NeuText.clear();
-    std::wstring id_text;  // the ID field of the last station or back-bearing record
+    NamelessCoordinates coordinates;
     std::wstring line;
     bool first = true;
     while (stream.ReadString(line)) {
@@ -87,9 +81,7 @@ int UNeditDoc::Load(UListCtrl* list) {
         }
         if (first) line = MakeUpperCaseString(line);
         first = false;
-        const int type = GetRecordType(line);
-        if (type == rec::Stn || type == rec::Bkb) id_text = GetIdText(line);
-        if (type == rec::Xyz && LacksOwnId(line)) line = ReformatRecord(line, id_text);
+        line = coordinates.Complete(*this, GetRecordType(line), line);
         if (list->AddRecord(list->GetItemCount(), line) >= 0) NeuText += list->GetItemText(list->GetItemCount() - 1) + L"\n";
         if (GetAbortProcess()) break;
     }
@@ -260,16 +252,8 @@ void UNeditDoc::UpdateDisplaySettings() {
 }
 
 void UNeditDoc::TakeJobUnits() {
-    switch (Settings.GetAngleUnit()) {
-        case nedit::AngleUnit::Degrees: OutputParameters.AngularUnit = 1; break;
-        case nedit::AngleUnit::Gons: OutputParameters.AngularUnit = 2; break;
-        default: OutputParameters.AngularUnit = 0;
-    }
-    switch (Settings.GetLengthUnit()) {
-        case nedit::LengthUnit::Feet: OutputParameters.LinearUnit = 1; break;
-        case nedit::LengthUnit::USFeet: OutputParameters.LinearUnit = 2; break;
-        default: OutputParameters.LinearUnit = 0;
-    }
+    OutputParameters.AngularUnit = nedit::IndexOf(Settings.GetAngleUnit());
+    OutputParameters.LinearUnit = nedit::IndexOf(Settings.GetLengthUnit());
 }
 
 void UNeditDoc::SetAbortProcess(bool abort) {

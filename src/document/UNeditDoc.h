@@ -36,6 +36,9 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat {
 public:
     static constexpr const wchar_t* kNeutralDataStream = L"NeutralData";
     static constexpr const wchar_t* kSettingsStream = L"Settings";
+    /// Stream modes: exclusive read-write to read, create-exclusive-write to write.
+    static constexpr unsigned kReadMode = 18;
+    static constexpr unsigned kCreateMode = 4113;
 
     /// A document of `job` (may be null: the defaults of a new job hold). Loads the record
     /// definition, reads the report's column flags from NEDIT.INI and takes the job's units.

@@ -8,10 +8,6 @@
 #include "platform/text/Format.h"
 #include "platform/text/WideText.h"
 
-namespace {
-constexpr unsigned kCreateMode = 4113;
-}
-
 URawDataContainer::URawDataContainer(USurveyDoc* job) : Job(job) {}
 
 URawDataContainer::~URawDataContainer() = default;
@@ -58,19 +54,21 @@ std::set<std::wstring> URawDataContainer::TakenNames() const {
     return taken;
 }
 
-std::wstring URawDataContainer::GetUntitledName() const {
+int URawDataContainer::FirstFreeNumber(const std::wstring& base, int last) const {
     const std::set<std::wstring> taken = TakenNames();
     int number = 1;
-    while (number < kNameLimit - 1 && taken.count(nedit::Format(L"Data%d", number)) != 0) ++number;
-    return nedit::Format(L"Data%d", number);
+    while (number < last && taken.count(nedit::Format(L"%s%d", base, number)) != 0) ++number;
+    return number;
+}
+
+std::wstring URawDataContainer::GetUntitledName() const {
+    return nedit::Format(L"Data%d", FirstFreeNumber(L"Data", kNameLimit - 1));
 }
 
 int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseName, const std::wstring& path,
                                                      std::wstring* createdName) {
     const std::wstring base = baseName.empty() ? std::wstring(L"Data") : baseName;
-    const std::set<std::wstring> taken = TakenNames();
-    int number = 1;
-    while (number < kNameLimit && taken.count(nedit::Format(L"%s%d", base, number)) != 0) ++number;
+    const int number = FirstFreeNumber(base, kNameLimit);
     if (number >= kNameLimit || GetStorage() == nullptr) return 0;
     const std::wstring name = nedit::Format(L"%s%d", base, number);
 
@@ -79,7 +77,7 @@ int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseNam
     UStorage storage;
     if (!storage.Create(*GetStorage(), name, 69650)) return 0;
     UStreamFile stream;
-    if (!stream.CreateStream(storage, UNeditDoc::kNeutralDataStream, kCreateMode)) {
+    if (!stream.CreateStream(storage, UNeditDoc::kNeutralDataStream, UNeditDoc::kCreateMode)) {
         storage.Release();
         return 0;
     }
@@ -90,7 +88,7 @@ int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseNam
     }
     stream.Close();
     UStreamFile settings;
-    if (settings.CreateStream(storage, UNeditDoc::kSettingsStream, kCreateMode)) {
+    if (settings.CreateStream(storage, UNeditDoc::kSettingsStream, UNeditDoc::kCreateMode)) {
         const std::string bytes = UNeditSettings().Write();
         settings.Write(bytes.data(), bytes.size());
         settings.Close();

@@ -48,6 +48,8 @@ public:
 private:
     /// The names of the documents and of every element of the container's storage.
     std::set<std::wstring> TakenNames() const;
+    /// The lowest number from 1 that makes `base` and it a free name; `last` when none below.
+    int FirstFreeNumber(const std::wstring& base, int last) const;
     UNeditDoc* Adopt(std::unique_ptr<UNeditDoc> doc);
 
     USurveyDoc* Job;

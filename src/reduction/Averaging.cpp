@@ -3,6 +3,7 @@
 
 #include <cmath>
 
+#include "platform/geometry/UAngle.h"
 #include "reduction/UNeditDatabase.h"
 
 namespace {
@@ -50,11 +51,7 @@ void AverageTarget(const UNeditDatabase& engine, SSSTRUCT& target) {
 
 int UNeditDatabase::CheckFace(double zenith) { return zenith > 180.0 && zenith < 360.0 ? 2 : 1; }
 
-double UNeditDatabase::chgface(double hAng) {
-    double result = std::fmod(hAng + 180.0, 360.0);
-    if (result < 0.0) result += 360.0;
-    return result;
-}
+double UNeditDatabase::chgface(double hAng) { return UAngle::ValidateData(hAng + 180.0); }
 
 double UNeditDatabase::chgVaface(double zenith) { return 360.0 - zenith; }
 

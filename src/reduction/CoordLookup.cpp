@@ -1,16 +1,15 @@
 // Where a station's or point's coordinates come from: the stations of this run, its points,
 // the coordinate records, the job, or the user; and the store of bearings between stations.
 
-#include <cstdio>
 #include <fstream>
 
 #include "document/UListCtrl.h"
+#include "platform/geometry/UAngle.h"
 #include "platform/io/LineReader.h"
 #include "platform/text/Format.h"
 #include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
-#include "reduction/UBKBCoordDlg.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "reduction/UNeditDatabase.h"
 
@@ -21,11 +20,7 @@ constexpr const wchar_t* kNoName = L"-99999";
 
 std::wstring BearingKey(const std::wstring& from, const std::wstring& to) { return from + L'\x1f' + to; }
 
-double Reverse(double bearing) {
-    double reversed = bearing + 180.0;
-    if (reversed >= 360.0) reversed -= 360.0;
-    return reversed;
-}
+double Reverse(double bearing) { return UAngle::ValidateData(bearing + 180.0); }
 
 }  // namespace
 

@@ -5,6 +5,7 @@
 #include "platform/messages/DialogHost.h"
 #include "platform/messages/Translate.h"
 #include "platform/text/WideText.h"
+#include "records/NamelessCoordinates.h"
 #include "records/RecordText.h"
 #include "records/RecordTypes.h"
 #include "records/UNeutralFileFormat.h"
@@ -14,9 +15,6 @@ namespace {
 
 // Progress is reported every so many lines, enough for a smooth bar at little cost.
 constexpr int kProgressEvery = 4096;
-
-// A coordinate record with at most two commas carries no name of its own.
-bool LacksOwnId(const std::wstring& row) { return nedit::CountOf(row, L',') <= 2; }
 
 }  // namespace
 
@@ -32,7 +30,7 @@ int UNeditDatabase::LoadNeFile(const std::wstring& path) {
 
     int next_row = 0;
     bool header_found = false;
-    std::wstring id_text;  // the ID field of the last station or back-bearing record
+    NamelessCoordinates coordinates;
     std::string bytes;
     for (int lines_read = 0; reader.ReadLine(bytes); ++lines_read) {
         if (lines_read % kProgressEvery == 0 && reader.Size() > 0) {
@@ -65,8 +63,7 @@ int UNeditDatabase::LoadNeFile(const std::wstring& path) {
         if ((type == rec::Unit || type == rec::Unit2) && AngleTypeHandler) {
             AngleTypeHandler(::GetAngleType(row));
         }
-        if (type == rec::Stn || type == rec::Bkb) id_text = GetIdText(row);
-        if (type == rec::Xyz && LacksOwnId(row)) row = Doc->ReformatRecord(row, id_text);
+        row = coordinates.Complete(*Doc, type, row);
 
         if (ListCtrl->AddRecord(next_row, row) >= 0) ++next_row;
     }

@@ -218,7 +218,7 @@ void UNeditDatabase::ProcessPtRecord() {
     SavePoint(id, Number(GetValue(fld::E)), Number(GetValue(fld::N)), Number(GetValue(fld::H)),
               OwnValue(fld::CO), 1, 2, 0);
     if (!CurPtNames) CurPtNames = std::make_unique<std::vector<std::wstring>>();
-    if (CurPtNames->empty() || nedit::ToUpper(CurPtNames->back()) != nedit::ToUpper(id)) {
+    if (CurPtNames->empty() || !nedit::EqualsIgnoreCase(CurPtNames->back(), id)) {
         CurPtNames->push_back(id);
     }
 }

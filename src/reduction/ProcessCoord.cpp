@@ -20,7 +20,6 @@
 namespace {
 
 constexpr const wchar_t* kGeneratingGraphics = L"Generating Graphics";
-constexpr double kPi = 3.141592653589793;
 
 }  // namespace
 
@@ -59,7 +58,7 @@ bool UNeditDatabase::IsSelfObservation(const STNSTRUCT& station, const SSSTRUCT&
 
 void UNeditDatabase::ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target, const StationWork& work,
                                   double& e, double& n, double& z) const {
-    const double zenith = target.VAng * kPi / 180.0;
+    const double zenith = target.VAng * kRadiansPerDegree;
     const double horizontal = std::sin(zenith) * target.SDist + PrismConst;
     const double vertical = std::cos(zenith) * target.SDist;
     const double theta = station.HMode == L'B' ? target.HAng : work.BackBearing + target.AngleFromBS;
@@ -266,6 +265,7 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
 }
 
 int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int report) {
+    const int from = GetPointIdx(station.StnName);
     for (std::size_t t = 0; t < station.FSList.size(); ++t) {
         SSSTRUCT& target = *station.FSList.at(t);
         if (!work.HeadPrinted && Report != nullptr && report == 1) {
@@ -274,7 +274,6 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
         }
         if (AbortRequested()) return 0;
         UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps), kGeneratingGraphics);
-        const int from = GetPointIdx(station.StnName);
         if (GetTravPointIdx(target.SSName) >= 0) {
             const int to = GetPointIdx(target.SSName);
             if (from >= 0 && to >= 0 && from != to) SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 1);

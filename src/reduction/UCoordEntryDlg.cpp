@@ -16,10 +16,6 @@ void UCoordEntryDlg::InitXYZSvy(double e, double n, double z, const std::wstring
     Database = {e, n, z, code, true};
 }
 
-void UCoordEntryDlg::SetEntered(double e, double n, double z, const std::wstring& code) {
-    Entered = {e, n, z, code, true};
-}
-
 const UCoordEntryDlg::Row& UCoordEntryDlg::RowOf(Source source) const {
     static const Row kBlank;
     switch (source) {

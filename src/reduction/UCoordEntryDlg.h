@@ -31,6 +31,7 @@ public:
     /// Takes the values of the selected row.
     bool OnOK() override;
 
+    /// The values of the "Enter Coordinate" row, as given or as typed.
     void InitXYZ(double e, double n, double z, const std::wstring& code);
     void InitXYZLocal(double e, double n, double z, const std::wstring& code);
     void InitXYZSvy(double e, double n, double z, const std::wstring& code);
@@ -53,8 +54,6 @@ public:
     Source GetSelectedSource() const { return Selected; }
     bool IsOffered(Source source) const { return RowOf(source).Offered; }
     bool IsEntryEditable() const { return Selected == Source::Enter; }
-    /// The values typed into the "Enter Coordinate" row.
-    void SetEntered(double e, double n, double z, const std::wstring& code);
     /// The row a source shows; an unoffered source shows blanks.
     const Row& RowOf(Source source) const;
     void SetApplyToAll(bool on) { ApplyToAll = on; }

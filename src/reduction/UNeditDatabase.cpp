@@ -47,12 +47,12 @@ UNeditDatabase::~UNeditDatabase() {
 
 bool UNeditDatabase::AbortRequested() const { return Progress != nullptr && Progress->AbortRequested(); }
 
-void UNeditDatabase::UpdateProgress(unsigned percent, const std::wstring& text) {
+void UNeditDatabase::UpdateProgress(unsigned percent, std::wstring_view text) {
     // Only changes go out, so that a run of millions of records does not flood the sink.
     if (Progress == nullptr || (percent == LastPercent && text == LastProgressText)) return;
     LastPercent = percent;
     LastProgressText = text;
-    Progress->Update(static_cast<int>(percent), text);
+    Progress->Update(static_cast<int>(percent), LastProgressText);
 }
 
 int UNeditDatabase::GetAngleType() const {

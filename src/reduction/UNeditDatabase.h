@@ -68,7 +68,7 @@ public:
     void SetError(int code) { ErrorCode = code; }
     /// The last error code, without showing its message.
     int GetErrorCode() const { return ErrorCode; }
-    void UpdateProgress(unsigned percent, const std::wstring& text);
+    void UpdateProgress(unsigned percent, std::wstring_view text);
 
     void SetOutput(bool output) { Output = output; }
     bool GetOutput() const { return Output; }
@@ -129,7 +129,6 @@ public:
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
     void SetCurHMode(wchar_t mode) { HMode = mode; }
     void SetTravFlag(int flag) { TravFlag = flag; }
-    const std::map<std::wstring, KnownCoord>& GetKnownCoords() const { return KnownCoordMap; }
     const std::wstring& GetDateText() const { return DateText; }
 
     // ---- Averaging --------------------------------------------------------------------

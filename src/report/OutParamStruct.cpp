@@ -49,6 +49,14 @@ void SetFlagsFromOrder(OutParamStruct& parameters, const std::wstring& order) {
     }
 }
 
+bool IsColumnToken(const std::wstring& token) {
+    const std::wstring upper = nedit::ToUpper(token);
+    for (const Column& column : kColumns) {
+        if (upper == column.token) return true;
+    }
+    return false;
+}
+
 std::wstring OrderText(const OutParamStruct& parameters) {
     std::wstring order;
     for (const Column& column : kColumns) {

@@ -38,5 +38,7 @@ int* ColumnFlag(OutParamStruct& parameters, int id);
 /// Sets each flag by whether its token (ID, LN, HA, VA, SD, HD, VD, HT, CO, EC, NC, HC)
 /// occurs anywhere in `order`, without regard to case: an empty text turns all flags off.
 void SetFlagsFromOrder(OutParamStruct& parameters, const std::wstring& order);
+/// True for the token of a column (ID, LN, HA, VA, SD, HD, VD, HT, CO, EC, NC, HC), in any case.
+bool IsColumnToken(const std::wstring& token);
 /// The tokens of the flags that are on, each followed by one blank, in the order above.
 std::wstring OrderText(const OutParamStruct& parameters);

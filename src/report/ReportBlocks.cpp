@@ -6,6 +6,7 @@
 
 #include "document/UNeditDoc.h"
 #include "platform/geometry/Tolerance.h"
+#include "platform/geometry/UAngle.h"
 #include "platform/messages/Translate.h"
 #include "platform/text/Format.h"
 #include "platform/text/WideText.h"
@@ -19,7 +20,6 @@ using nedit::Translate;
 namespace {
 
 constexpr const wchar_t* kLabel = L"%-29s : %s";
-constexpr double kRadiansPerDegree = 3.141592653589793 / 180.0;
 
 }  // namespace
 
@@ -255,15 +255,13 @@ int UNeditReport::PrintTraverseInfo(double dE, double dN, double dH, double brg,
     KeepLines(7);
     const std::wstring east = job.LengthToString(dE, false, false, 3, -1, true, false);
     const std::wstring north = job.LengthToString(dN, false, false, 3, -1, true, false);
-    const std::wstring height = job.UnitLengthToString(
-        job.ConvertLength(job.GetLengthUnit(), Is_Zero(dH, false) ? 0.0 : dH), false, false, 3, -1, false);
+    // Heights and areas are in the job's unit already, as the job shows them.
+    const std::wstring height = job.UnitLengthToString(Is_Zero(dH, false) ? 0.0 : dH, false, false, 3, -1, false);
     W(Translate(XYFlag ? L"                               East Diff            North Diff           Elev Diff"
                        : L"                               North Diff           East Diff            Elev Diff"),
       2, 1);
     const auto [first, second] = InOrder(east, north);
     W(Format(L"Coordinate Misclose            %-20s %-20s %-20s", first, second, height), 0, 2);
-    // Areas come in the square of the job's unit; the job's area display takes square metres.
-    const double metres_per_unit = nedit::MetresPer(job.GetLengthUnit());
     auto angle_text = [&job](double value) {
         std::wstring text;
         ConvertAngleToDisplay(job, value, text, 0);
@@ -273,8 +271,7 @@ int UNeditReport::PrintTraverseInfo(double dE, double dN, double dH, double brg,
              Translate(L"Distance"), job.DistanceToString(dist, false, false, 3, -1, false, false)),
       0, 1);
     W(Format(L"%s                  %-20.3f %s      %-20s", Translate(L"Enclosed Area"),
-             area > 0.0 ? ConvertAreaToDisplay(job, area * metres_per_unit * metres_per_unit) : 0.0,
-             Translate(L"Traverse Length"),
+             area > 0.0 ? area : 0.0, Translate(L"Traverse Length"),
              job.DistanceToString(length, false, false, 3, -1, false, false)),
       0, 1);
     W(Format(L"%s                  %-20d %s             %-20s", Translate(L"No  of Setups"), setups,

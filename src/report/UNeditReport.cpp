@@ -85,11 +85,11 @@ void UNeditReport::UpdateSettings() {
 }
 
 void UNeditReport::SetOutUA(int unit) {
-    if (unit >= 0 && unit <= 2) OutUA = L"SDG"[unit];
+    if (unit >= 0 && unit <= 2) OutUA = nedit::LetterOf(nedit::AngleUnitFromIndex(unit));
 }
 
 void UNeditReport::SetOutUL(int unit) {
-    if (unit >= 0 && unit <= 2) OutUL = L"MFU"[unit];
+    if (unit >= 0 && unit <= 2) OutUL = nedit::LetterOf(nedit::LengthUnitFromIndex(unit));
 }
 
 std::wstring UNeditReport::IniValue(const std::wstring& section, const std::wstring& key) const {

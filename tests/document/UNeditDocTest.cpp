@@ -93,7 +93,7 @@ TEST_F(RawDataDocuments, AReductionAddsTheCoordinatesItWasGiven) {
     nedit::HeadlessDialogHost host;
     host.SetDialogScript(L"Control Point Coordinate", [](nedit::UDialogLogic& logic) {
         auto& dialog = static_cast<UCoordEntryDlg&>(logic);
-        dialog.SetEntered(100.0, 200.0, 30.0, L"");
+        dialog.InitXYZ(100.0, 200.0, 30.0, L"");
         return dialog.OnOK() ? nedit::mb::IdOk : nedit::mb::IdCancel;
     });
     doc->SetDialogHost(&host);

@@ -122,7 +122,7 @@ TEST_F(Reduction, AStationNobodyKnowsIsPositionedByTheUsersAnswer) {
         EXPECT_FALSE(dialog.IsOffered(UCoordEntryDlg::Source::Database));
         EXPECT_FALSE(dialog.IsOffered(UCoordEntryDlg::Source::Field));
         EXPECT_EQ(dialog.GetSelectedSource(), UCoordEntryDlg::Source::Enter);
-        dialog.SetEntered(300.0, 400.0, 20.0, L"CP");
+        dialog.InitXYZ(300.0, 400.0, 20.0, L"CP");
         dialog.SetApplyToAll(true);
         return dialog.OnOK() ? nedit::mb::IdOk : nedit::mb::IdCancel;
     });

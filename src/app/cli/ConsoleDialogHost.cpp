@@ -100,7 +100,7 @@ int ConsoleDialogHost::AskCoordinates(UCoordEntryDlg& dialog) {
         const double e = AskNumber(ReadAnswer("Easting: "), entered.East);
         const double n = AskNumber(ReadAnswer("Northing: "), entered.North);
         const double h = AskNumber(ReadAnswer("Height (blank for none): "), entered.Height);
-        dialog.SetEntered(e, n, h, entered.Code);
+        dialog.InitXYZ(e, n, h, entered.Code);
     }
     dialog.SetApplyToAll(ReadAnswer("Apply to All? [y/N] ") == "y");
     return dialog.OnOK() ? nedit::mb::IdOk : nedit::mb::IdCancel;

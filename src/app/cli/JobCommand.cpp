@@ -1,14 +1,12 @@
 // sxnedit job ...: make a job file, list, import and export its points, and describe it.
 
 #include <cstdio>
-#include <fstream>
 #include <map>
 #include <string>
 #include <vector>
 
 #include "Commands.h"
 #include "PointOutput.h"
-#include "RecordSession.h"
 #include "platform/io/LineReader.h"
 #include "platform/job/Csv.h"
 #include "platform/settings/DataDirectory.h"

@@ -2,7 +2,6 @@
 // JSON, or as a CSV file.
 
 #include <algorithm>
-#include <cctype>
 #include <cstdio>
 #include <initializer_list>
 #include <string>
@@ -14,6 +13,7 @@
 #include "platform/job/JobError.h"
 #include "platform/job/USurveyDoc.h"
 #include "platform/text/WideText.h"
+#include "report/OutParamStruct.h"
 
 namespace {
 
@@ -42,15 +42,11 @@ int Choice(const std::string& word, std::initializer_list<const char*> choices) 
 
 // Column tokens as --columns takes them, separated by commas.
 bool ValidColumns(const std::string& columns) {
-    static const char* const kTokens[] = {"ID", "LN", "HA", "VA", "SD", "HD", "VD", "HT", "CO", "EC", "NC", "HC"};
     std::size_t start = 0;
     while (start <= columns.size()) {
         const std::size_t comma = std::min(columns.find(',', start), columns.size());
-        std::string token = columns.substr(start, comma - start);
-        for (char& c : token) c = static_cast<char>(std::toupper(static_cast<unsigned char>(c)));
-        if (!token.empty() && std::find(std::begin(kTokens), std::end(kTokens), token) == std::end(kTokens)) {
-            return false;
-        }
+        const std::wstring token = nedit::FromUtf8(columns.substr(start, comma - start));
+        if (!token.empty() && !IsColumnToken(token)) return false;
         start = comma + 1;
     }
     return true;

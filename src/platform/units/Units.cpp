@@ -20,6 +20,17 @@ AngleUnit AngleUnitFromLetter(wchar_t letter) {
     }
 }
 
+LengthUnit LengthUnitFromIndex(int index) {
+    return index >= 0 && index <= 2 ? static_cast<LengthUnit>(index) : LengthUnit::Metres;
+}
+
+AngleUnit AngleUnitFromIndex(int index) {
+    return index >= 0 && index <= 2 ? static_cast<AngleUnit>(index) : AngleUnit::DegMinSec;
+}
+
+int IndexOf(LengthUnit unit) { return static_cast<int>(unit); }
+int IndexOf(AngleUnit unit) { return static_cast<int>(unit); }
+
 wchar_t LetterOf(LengthUnit unit) {
     switch (unit) {
         case LengthUnit::Feet: return L'F';

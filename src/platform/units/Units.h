@@ -4,8 +4,15 @@
 
 namespace nedit {
 
+/// The order of the units is the one option lists count them in: 0, 1, 2.
 enum class LengthUnit { Metres, Feet, USFeet };
 enum class AngleUnit { DegMinSec, Degrees, Gons };
+
+/// The unit at an index of the option lists; anything outside 0 to 2 gives the first.
+LengthUnit LengthUnitFromIndex(int index);
+AngleUnit AngleUnitFromIndex(int index);
+int IndexOf(LengthUnit unit);
+int IndexOf(AngleUnit unit);
 
 /// "M" metres, "F" or "1" feet, "U" or "2" US survey feet; anything else is metres.
 LengthUnit LengthUnitFromLetter(wchar_t letter);
