@@ -73,7 +73,6 @@ int UNeditDatabase::PrepareRows(const std::vector<std::wstring>& rows) {
     DeleteList();
     // Every row may name a station or a point: room for all of them up front spares the
     // name tables their rehashing as a large survey fills them.
-    StationsByName.Reserve(rows.size());
     PointIndex.Reserve(rows.size());
     PointList.reserve(rows.size());
     TravFlag = 0;
