@@ -1,8 +1,7 @@
 #include "document/UNeditDoc.h"
 
-#include <fstream>
-
 #include "document/UListCtrl.h"
+#include "platform/io/ReplaceFile.h"
 #include "platform/job/USurveyDoc.h"
 #include "platform/messages/DialogHost.h"
 #include "platform/messages/Translate.h"
@@ -128,13 +127,11 @@ int UNeditDoc::WriteSettingsStream() {
 }
 
 int UNeditDoc::Save(const std::wstring& path, const UListCtrl* list) const {
-    std::ofstream file(nedit::ToUtf8(path), std::ios::binary | std::ios::trunc);
-    if (!file) return 0;
+    std::string text;
     if (list != nullptr) {
-        for (const std::wstring& row : list->GetRows()) file << nedit::ToUtf8(row) << '\n';
+        for (const std::wstring& row : list->GetRows()) text += nedit::ToUtf8(row) + '\n';
     }
-    file.close();
-    return file ? 1 : 0;
+    return nedit::ReplaceFile(nedit::ToUtf8(path), text) ? 1 : 0;
 }
 
 int UNeditDoc::SaveData() { return Save(List.get(), 0); }

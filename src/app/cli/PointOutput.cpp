@@ -1,9 +1,9 @@
 #include "PointOutput.h"
 
 #include <cstdio>
-#include <fstream>
 
 #include "Json.h"
+#include "platform/io/ReplaceFile.h"
 #include "platform/job/Csv.h"
 #include "platform/text/Format.h"
 #include "platform/text/NumberText.h"
@@ -48,9 +48,7 @@ std::string PointsCsv(const std::vector<PointRow>& points) {
 }
 
 bool WritePointsCsv(const std::string& path, const std::vector<PointRow>& points) {
-    std::ofstream file(path, std::ios::binary | std::ios::trunc);
-    file << PointsCsv(points);
-    file.close();
-    if (!file) std::fprintf(stderr, "sxnedit: cannot write %s\n", path.c_str());
-    return static_cast<bool>(file);
+    if (nedit::ReplaceFile(path, PointsCsv(points))) return true;
+    std::fprintf(stderr, "sxnedit: cannot write %s\n", path.c_str());
+    return false;
 }

@@ -1,5 +1,7 @@
 #include "platform/job/USvyCodeLib.h"
 
+#include "platform/io/ReplaceFile.h"
+
 #include <cstdio>
 #include <fstream>
 
@@ -166,37 +168,22 @@ bool USvyCodeLib::LoadFile(const std::string& path, std::wstring& error) {
 }
 
 bool USvyCodeLib::SaveFile(const std::string& path, std::wstring& error) const {
-    const std::string temporary = path + ".tmp";
-    {
-        std::ofstream out(temporary, std::ios::binary | std::ios::trunc);
-        std::string header;
-        for (const auto& column : TextColumns())
-            header += std::string(header.empty() ? "" : ",") + column.first;
-        for (const auto& column : IntColumns()) header += std::string(",") + column.first;
-        out << header << '\n';
-        for (const USvyCode& code : codes_) {
-            std::string row;
-            for (const auto& column : TextColumns()) {
-                if (column.second != &USvyCode::Code) row += ',';
-                row += nedit::CsvField(nedit::ToUtf8(code.*column.second));
-            }
-            for (const auto& column : IntColumns())
-                row += "," + std::to_string(code.*column.second);
-            out << row << '\n';
+    std::string text;
+    for (const auto& column : TextColumns()) text += std::string(text.empty() ? "" : ",") + column.first;
+    for (const auto& column : IntColumns()) text += std::string(",") + column.first;
+    text += '\n';
+    for (const USvyCode& code : codes_) {
+        std::string row;
+        for (const auto& column : TextColumns()) {
+            if (column.second != &USvyCode::Code) row += ',';
+            row += nedit::CsvField(nedit::ToUtf8(code.*column.second));
         }
-        out.flush();
-        if (!out) {
-            std::remove(temporary.c_str());
-            error = L"Cannot write the code library " + nedit::FromUtf8(path) + L".";
-            return false;
-        }
+        for (const auto& column : IntColumns()) row += "," + std::to_string(code.*column.second);
+        text += row + '\n';
     }
-    if (std::rename(temporary.c_str(), path.c_str()) != 0) {
-        std::remove(temporary.c_str());
-        error = L"Cannot write the code library " + nedit::FromUtf8(path) + L".";
-        return false;
-    }
-    return true;
+    if (nedit::ReplaceFile(path, text)) return true;
+    error = L"Cannot write the code library " + nedit::FromUtf8(path) + L".";
+    return false;
 }
 
 void USvyCodeLib::LoadJob(nedit::JobDatabase& job) {

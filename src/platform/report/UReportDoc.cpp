@@ -1,7 +1,6 @@
 #include "platform/report/UReportDoc.h"
 
-#include <fstream>
-
+#include "platform/io/ReplaceFile.h"
 #include "platform/text/WideText.h"
 
 UReportDoc::UReportDoc(std::wstring title) : Title(std::move(title)) {}
@@ -44,9 +43,4 @@ std::wstring UReportDoc::GetText() const {
     return out;
 }
 
-bool UReportDoc::SaveAsText(const std::string& path) const {
-    std::ofstream file(path, std::ios::binary | std::ios::trunc);
-    file << nedit::ToUtf8(GetText());
-    file.close();
-    return static_cast<bool>(file);
-}
+bool UReportDoc::SaveAsText(const std::string& path) const { return nedit::ReplaceFile(path, nedit::ToUtf8(GetText())); }
