@@ -23,6 +23,20 @@ struct MEASSTRUCT {
 /// The measurements of one target. A forward target shares them with its side shot.
 using MeasurementList = std::vector<MEASSTRUCT>;
 
+/// One check shot, folded to face 1.
+struct SSCheck {
+    std::wstring SSName;
+    std::wstring SSCode;
+    double HAng = 0.0;
+    double VAng = 0.0;
+    double SDist = 0.0;
+    double HtTarget = 0.0;
+    double OffsetAlong = 0.0;
+    double OffsetUp = 0.0;
+    double OffsetRight = 0.0;
+    int RecordNo = 0;
+};
+
 struct STNSTRUCT;
 
 /// An observed target under a station: one node per target name and list.
@@ -44,6 +58,8 @@ struct SSSTRUCT {
     int ForwardFlag = 0;
     int SkipMean = 0;
     int RecordNo = 0;  // the row that last observed the target, counted from 1
+    std::vector<std::wstring> PtNames;  // names of PT records filed before this observation
+    std::vector<SSCheck> ChkShots;      // check shots filed before it
 };
 
 /// The targets of one list of a station, in order. Short lists are searched in order; a
@@ -101,23 +117,12 @@ struct STNSTRUCT {
     TargetList SSList;
     bool SwingOpen = true;
     bool HasCheck = false;
+    std::vector<std::wstring> PtNames;  // names of PT records filed before the station
+    std::vector<SSCheck> ChkShots;      // check shots that end the station
     STNSTRUCT* NextSameName = nullptr;  // the engine's chain of nodes that share a name,
     STNSTRUCT* LastSameName = nullptr;  // and, on its first node, the chain's end
 };
 
-/// One check shot, folded to face 1.
-struct SSCheck {
-    std::wstring SSName;
-    std::wstring SSCode;
-    double HAng = 0.0;
-    double VAng = 0.0;
-    double SDist = 0.0;
-    double HtTarget = 0.0;
-    double OffsetAlong = 0.0;
-    double OffsetUp = 0.0;
-    double OffsetRight = 0.0;
-    int RecordNo = 0;
-};
 
 /// A directed line between two names with its bearing in degrees.
 struct ULINEBEAR_STRUCT {

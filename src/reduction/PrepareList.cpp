@@ -28,6 +28,10 @@ constexpr double kMeanEarthRadiusMetres = 6370000.0;
 
 double Number(const std::wstring& text) { return nedit::TextToDouble(text); }
 
+void AppendNames(std::vector<std::wstring>& to, const std::vector<std::wstring>& names) {
+    to.insert(to.end(), names.begin(), names.end());
+}
+
 // A row as the reduction reads it: at most 255 characters, trimmed, in upper case. Rows
 // that came through the list's gate are so already and are read in place.
 const std::wstring& ReadRow(const std::wstring& row, std::wstring& buffer) {
@@ -87,7 +91,6 @@ int UNeditDatabase::PrepareRows(const std::vector<std::wstring>& rows) {
         ProcessRecord(type, row, static_cast<int>(index) + 1);
         if (index + 1 == count && type != rec::Stn && PendingStn) {
             if (DummyStn(*PendingStn)) {
-                StnPtNames.erase(PendingStn.get());
                 PendingStn.reset();
                 CurStn = nullptr;
             } else {
@@ -233,16 +236,16 @@ void UNeditDatabase::ProcessStnRecord() {
     station->Swing = FirstSwing;
     CurSwing = 0.0;
     if (CurPtNames) {
-        StnPtNames.emplace(station.get(), std::move(*CurPtNames));
+        station->PtNames = std::move(*CurPtNames);
         CurPtNames.reset();
     }
     if (PendingStn) {
         if (DummyStn(*PendingStn)) {
             // A station with nothing observed is dropped; the points named before it move on.
-            MoveStnPtNames(PendingStn.get(), station.get());
+            AppendNames(station->PtNames, PendingStn->PtNames);
         } else {
             if (CurChkList) {
-                ChkShotMap.emplace(PendingStn.get(), std::move(*CurChkList));
+                PendingStn->ChkShots = std::move(*CurChkList);
                 CurChkList.reset();
             }
             InsertStn(std::move(PendingStn), 0);
@@ -300,12 +303,11 @@ void UNeditDatabase::ProcessObservation(int type, int recordNo) {
     // A target observed again already holds the names filed before its first observation:
     // the names filed since then join them.
     if (CurPtNames) {
-        std::vector<std::wstring>& names = StnPtNames[inserted];
-        names.insert(names.end(), CurPtNames->begin(), CurPtNames->end());
+        AppendNames(inserted->PtNames, *CurPtNames);
         CurPtNames.reset();
     }
     if (CurChkList) {
-        ChkShotMap.emplace(inserted, std::move(*CurChkList));
+        if (inserted->ChkShots.empty()) inserted->ChkShots = std::move(*CurChkList);
         CurChkList.reset();
     }
 }
@@ -373,16 +375,6 @@ STNSTRUCT* UNeditDatabase::FirstNamed(const std::wstring& name) const {
     return first == NameIndex::npos ? nullptr : Stations[first].get();
 }
 
-void UNeditDatabase::MoveStnPtNames(const void* from, const void* to) {
-    const auto found = StnPtNames.find(from);
-    if (found == StnPtNames.end()) return;
-    std::vector<std::wstring> names = std::move(found->second);
-    StnPtNames.erase(found);
-    if (names.empty()) return;
-    std::vector<std::wstring>& target = StnPtNames[to];
-    target.insert(target.end(), names.begin(), names.end());
-}
-
 int UNeditDatabase::InsertSSMS(std::unique_ptr<SSSTRUCT> target, const MEASSTRUCT& measurement,
                                int isBackSight) {
     if (CurStn == nullptr) return 0;
@@ -397,14 +389,9 @@ int UNeditDatabase::InsertSSMS(std::unique_ptr<SSSTRUCT> target, const MEASSTRUC
     // measurements, so the code and record number are those of the latest observation.
     target->Meas = existing->Meas;
     target->Meas->push_back(measurement);
-    const auto check_shots = ChkShotMap.find(existing);
-    if (check_shots != ChkShotMap.end()) {
-        std::vector<SSCheck> moved = std::move(check_shots->second);
-        ChkShotMap.erase(check_shots);
-        ChkShotMap.emplace(target.get(), std::move(moved));
-    }
-    // Points named before the old observation stay with the target as it now stands.
-    MoveStnPtNames(existing, target.get());
+    // Check shots and point names filed before the old observation stay with the target.
+    target->ChkShots = std::move(existing->ChkShots);
+    target->PtNames = std::move(existing->PtNames);
     if (CurSS == existing) CurSS = target.get();
     list.Replace(existing, std::move(target));
     return 1;
@@ -424,6 +411,9 @@ int UNeditDatabase::AddToFSptr(STNSTRUCT* station, SSSTRUCT* target) {
     if (station->FSList.Find(target->SSName) != nullptr) return 1;
     auto copy = std::make_unique<SSSTRUCT>();
     CopySS(*target, *copy);  // the copy shares the side shot's measurements
+    // What was filed before the side shot stays with it; its forward copy carries none.
+    copy->PtNames.clear();
+    copy->ChkShots.clear();
     station->FSList.Append(std::move(copy));
     return 1;
 }
@@ -524,9 +514,6 @@ int UNeditDatabase::DeleteList() {
     PendingStn.reset();
     CurStn = nullptr;
     CurSS = nullptr;
-    // Entries keyed by nodes that no longer exist must not outlive them.
-    StnPtNames.clear();
-    ChkShotMap.clear();
     return 1;
 }
 

@@ -366,7 +366,7 @@ void UNeditDatabase::PrintTarget(const STNSTRUCT& station, const SSSTRUCT& targe
 bool UNeditDatabase::HaveSideshotsToReport(const STNSTRUCT* station, const std::vector<std::wstring>* /*records*/) const {
     if (station == nullptr) return false;
     for (const auto& target : station->SSList) {
-        if (StnPtNames.count(target.get()) != 0 || ChkShotMap.count(target.get()) != 0) return true;
+        if (!target->PtNames.empty() || !target->ChkShots.empty()) return true;
         if (target->AngleValid && !target->ForwardFlag) return true;
     }
     return false;

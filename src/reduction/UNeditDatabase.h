@@ -234,7 +234,6 @@ private:
     void ProcessBkbRecord();
     void ProcessObservation(int type, int recordNo);
     void ApplyDistanceCorrection(MEASSTRUCT& measurement) const;
-    void MoveStnPtNames(const void* from, const void* to);
     int FindCoordinateRow(const std::wstring& name, bool coordinates, int type, double* e, double* n, double* z);
     void ReplaceRow(int row, const std::wstring& text);
     /// The first node of that exact name, in list order; the others follow by NextSameName.
@@ -303,9 +302,7 @@ private:
     std::unique_ptr<STNSTRUCT> PendingStn; // owns the station being filled until it joins the list
     SSSTRUCT* CurSS = nullptr;
     std::unique_ptr<std::vector<std::wstring>> CurPtNames;
-    std::map<const void*, std::vector<std::wstring>> StnPtNames;
     std::unique_ptr<std::vector<SSCheck>> CurChkList;
-    std::map<const void*, std::vector<SSCheck>> ChkShotMap;
     std::map<std::wstring, KnownCoord> KnownCoordMap;
     std::map<std::wstring, double> StnScaleMap;
 

@@ -71,11 +71,18 @@ TEST_F(PrepareList, EmptyStationsAreDroppedAndTheirPointNamesMoveOn) {
          L"PT ID=K1,E=1,N=2,H=3\n"
          L"STN ID=DROPPED\n"
          L"STN ID=A\n"
+         L"PT ID=K2,E=1,N=1,H=1\n"
          L"SS ID=P,HA=0,VA=90,SD=1,HT=0\n"
+         L"PT ID=K3,E=1,N=1,H=1\n"
+         L"SS ID=P,HA=0,VA=90,SD=2,HT=0\n"
          L"STN ID=LAST\n");
     ASSERT_EQ(engine.PrepareList(), 1);
     EXPECT_EQ(StationNamed(engine, L"DROPPED"), nullptr);
-    EXPECT_NE(StationNamed(engine, L"A"), nullptr);
+    const STNSTRUCT* a = StationNamed(engine, L"A");
+    ASSERT_NE(a, nullptr);
+    EXPECT_EQ(a->PtNames, std::vector<std::wstring>{L"K1"});
+    // Names filed before each observation of P stay with P, the later after the earlier.
+    EXPECT_EQ(a->SSList.Find(L"P")->PtNames, (std::vector<std::wstring>{L"K2", L"K3"}));
     // A station record in the last row never reaches the list; it stays the current one.
     EXPECT_EQ(StationNamed(engine, L"LAST"), nullptr);
     ASSERT_NE(engine.GetCurStn(), nullptr);
