@@ -1,5 +1,5 @@
 #pragma once
-// What lines, arcs and circles of the job have beside their geometry: a line style and a
+// What lines, arcs, circles and polylines of the job have beside their geometry: a line style and a
 // thickness, on top of everything an object of the job has.
 
 #include "platform/job/UDBObject.h"

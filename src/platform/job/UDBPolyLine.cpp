@@ -6,7 +6,7 @@
 #include "platform/job/USurveyDoc.h"
 
 UDBPolyLine::UDBPolyLine(USurveyDoc* job, long id)
-    : UDBObject(job, nedit::kPolylineKind, "polyline") {
+    : UDBLinework(job, nedit::kPolylineKind, "polyline") {
     if (id != 0) Load(id);
 }
 

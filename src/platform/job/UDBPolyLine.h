@@ -8,14 +8,14 @@
 #include <string>
 #include <vector>
 
-#include "platform/job/UDBObject.h"
+#include "platform/job/UDBLinework.h"
 
 struct UVertex {
     double Bulge = 0.0;
     long PointId = 0;
 };
 
-class UDBPolyLine : public UDBObject {
+class UDBPolyLine : public UDBLinework {
   public:
     explicit UDBPolyLine(USurveyDoc* job, long id = 0);
 
@@ -38,10 +38,6 @@ class UDBPolyLine : public UDBObject {
 
     const std::wstring& GetName() const { return name_; }
     void SetName(const std::wstring& name) { name_ = name; }
-    int GetLineStyle() const { return line_style_; }
-    void SetLineStyle(int style) { line_style_ = style; }
-    int GetThickness() const { return thickness_; }
-    void SetThickness(int thickness) { thickness_ = thickness; }
 
     /// Detaching and re-attaching a polyline to its points, for callers that replace one
     /// polyline by another: Save already rewrites the vertex rows in one transaction, so
@@ -54,7 +50,5 @@ class UDBPolyLine : public UDBObject {
 
   private:
     std::wstring name_;
-    int line_style_ = 0;
-    int thickness_ = 0;
     std::vector<UVertex> vertices_;
 };
