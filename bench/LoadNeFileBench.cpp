@@ -26,7 +26,8 @@ std::string MakeSurvey(long rows) {
         if (row % 21 == 2) {
             out << "STN       ID=S" << row << ",HI=1.550,CO=STN\n";
         } else {
-            out << "SS        ID=P" << row << ",HA=123.4530,VA=89.5500,SD=35.214,HT=1.600,CO=FC01\n";
+            out << "SS        ID=P" << row
+                << ",HA=123.4530,VA=89.5500,SD=35.214,HT=1.600,CO=FC01\n";
         }
     }
     return path;
@@ -49,5 +50,9 @@ void LoadNeutralFile(benchmark::State& state) {
 
 }  // namespace
 
-BENCHMARK(LoadNeutralFile)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond);
+BENCHMARK(LoadNeutralFile)
+    ->Arg(10'000)
+    ->Arg(100'000)
+    ->Arg(1'000'000)
+    ->Unit(benchmark::kMillisecond);
 BENCHMARK_MAIN();

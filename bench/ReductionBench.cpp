@@ -24,18 +24,21 @@ void FillSurvey(UListCtrl& list, int stations) {
     for (int s = 0; s < stations; ++s) {
         list.AddRecord(list.GetItemCount(), Format(L"STN       ID=S%d,HI=1.500,CO=STN", s));
         if (s == 0) {
-            list.AddRecord(list.GetItemCount(), L"XYZ       ID=S0,E=100000.000,N=200000.000,H=50.000");
+            list.AddRecord(list.GetItemCount(),
+                           L"XYZ       ID=S0,E=100000.000,N=200000.000,H=50.000");
             list.AddRecord(list.GetItemCount(), L"BKB       ID=R,BRG=90.0000,HA=0");
         } else {
             list.AddRecord(list.GetItemCount(), Format(L"BKB       ID=S%d,HA=0", s - 1));
-            list.AddRecord(list.GetItemCount(), Format(L"BS        ID=S%d,HA=0,VA=90,SD=50.000,HT=1.500", s - 1));
+            list.AddRecord(list.GetItemCount(),
+                           Format(L"BS        ID=S%d,HA=0,VA=90,SD=50.000,HT=1.500", s - 1));
         }
         for (int k = 0; k < kSideShots; ++k) {
             list.AddRecord(list.GetItemCount(),
-                           Format(L"SS        ID=P%d_%d,HA=%.4f,VA=89.5,SD=%.3f,HT=1.600,CO=FC01", s, k,
-                                  std::fmod(17.0 * k + 3.0, 360.0), 5.0 + k));
+                           Format(L"SS        ID=P%d_%d,HA=%.4f,VA=89.5,SD=%.3f,HT=1.600,CO=FC01",
+                                  s, k, std::fmod(17.0 * k + 3.0, 360.0), 5.0 + k));
         }
-        list.AddRecord(list.GetItemCount(), Format(L"SS        ID=S%d,HA=180,VA=90,SD=50.000,HT=1.500", s + 1));
+        list.AddRecord(list.GetItemCount(),
+                       Format(L"SS        ID=S%d,HA=180,VA=90,SD=50.000,HT=1.500", s + 1));
     }
 }
 

@@ -36,12 +36,13 @@ unsigned StoreByName(std::vector<UNeditPt>& store, NameIndex& index, UNeditPt po
 
 }  // namespace
 
-unsigned UNeditDatabase::SavePoint(const std::wstring& name, double x, double y, double z, std::wstring code,
-                                   int /*ptFlag*/, unsigned flags, int derived) {
+unsigned UNeditDatabase::SavePoint(const std::wstring& name, double x, double y, double z,
+                                   std::wstring code, int /*ptFlag*/, unsigned flags, int derived) {
     const int existing = GetPointIdx(name);
     const std::wstring_view trimmed = nedit::TrimView(code);
     if (trimmed.size() != code.size()) code = std::wstring(trimmed);
-    if (existing >= 0 && code.empty()) code = PointList[static_cast<std::size_t>(existing)].GetCode();
+    if (existing >= 0 && code.empty())
+        code = PointList[static_cast<std::size_t>(existing)].GetCode();
     const bool from_pt_record = (flags & 2u) != 0;
     unsigned point_flags = 0;
     if (from_pt_record) point_flags |= UNeditPt::kFromPTRecord;
@@ -71,12 +72,14 @@ unsigned UNeditDatabase::SaveTravPoint(const std::wstring& name, double x, doubl
 
 int UNeditDatabase::SaveLine(unsigned from, unsigned to, int stationLine) {
     constexpr unsigned kNone = static_cast<unsigned>(-1);
-    if (from == kNone || to == kNone || from >= PointList.size() || to >= PointList.size()) return 0;
+    if (from == kNone || to == kNone || from >= PointList.size() || to >= PointList.size())
+        return 0;
     const UNeditPt& start = PointList[from];
     const UNeditPt& end = PointList[to];
     const int existing = GetLineIdx(start.GetID(), end.GetID());
     // An existing line keeps its direction.
-    const bool forward = existing < 0 || LineList[static_cast<std::size_t>(existing)].GetFromPt() == start.GetID();
+    const bool forward =
+        existing < 0 || LineList[static_cast<std::size_t>(existing)].GetFromPt() == start.GetID();
     UNeditLine line = forward ? UNeditLine(start, end) : UNeditLine(end, start);
     if (stationLine != 0) line.SetStationLine(1);
     // Code, layer, colour, line type and thickness come from the survey code library.
@@ -89,7 +92,8 @@ int UNeditDatabase::SaveLine(unsigned from, unsigned to, int stationLine) {
     return 1;
 }
 
-int UNeditDatabase::SaveArc(const UNeditPt& first, const UNeditPt& second, const UNeditPt& third, ArcType type) {
+int UNeditDatabase::SaveArc(const UNeditPt& first, const UNeditPt& second, const UNeditPt& third,
+                            ArcType type) {
     ArcType stored = type;
     // About a centre, the turn from the first point to the second gives the arc's sense.
     if (type != 1 && UAngle(first, third, second).Degrees() < 0.0) stored |= UWArc::kAnticlockwise;
@@ -117,7 +121,8 @@ void UNeditDatabase::DeleteTopoLines() {
     CircleList.clear();
     std::vector<UNeditPt> kept_points;
     for (UNeditPt& point : PointList) {
-        if (point.GetPtFlag() != 0 || named.count(point.GetID()) != 0) kept_points.push_back(std::move(point));
+        if (point.GetPtFlag() != 0 || named.count(point.GetID()) != 0)
+            kept_points.push_back(std::move(point));
     }
     PointList = std::move(kept_points);
     RebuildPointIndex();
@@ -151,16 +156,24 @@ void UNeditDatabase::SetMinMaxCoord() {
     DocRect = UWRect(XMin, YMin, XMax, YMax);
 }
 
-int UNeditDatabase::GetPointIdx(const std::wstring& name) const { return IndexOf(PointIndex, name); }
-int UNeditDatabase::GetAddPointIdx(const std::wstring& name) const { return IndexOf(AddPtIndex, name); }
-int UNeditDatabase::GetTravPointIdx(const std::wstring& name) const { return IndexOf(TravPtIndex, name); }
+int UNeditDatabase::GetPointIdx(const std::wstring& name) const {
+    return IndexOf(PointIndex, name);
+}
+int UNeditDatabase::GetAddPointIdx(const std::wstring& name) const {
+    return IndexOf(AddPtIndex, name);
+}
+int UNeditDatabase::GetTravPointIdx(const std::wstring& name) const {
+    return IndexOf(TravPtIndex, name);
+}
 
 UNeditPt* UNeditDatabase::SearchPt(const std::wstring& name) {
     const int index = GetPointIdx(name);
     return index < 0 ? nullptr : &PointList[static_cast<std::size_t>(index)];
 }
 
-UNeditPt* UNeditDatabase::GetLastPoint() { return PointList.empty() ? nullptr : &PointList.back(); }
+UNeditPt* UNeditDatabase::GetLastPoint() {
+    return PointList.empty() ? nullptr : &PointList.back();
+}
 
 bool UNeditDatabase::GetPtNameAt(int index, std::wstring& name) const {
     if (index < 0 || static_cast<std::size_t>(index) >= PointList.size()) {
@@ -183,13 +196,14 @@ int UNeditDatabase::Check_In_LnList(const std::wstring& name) const {
     return 0;
 }
 
-int UNeditDatabase::SearchArc(const std::wstring& a, const std::wstring& b, const std::wstring& third,
-                              ArcType type) const {
+int UNeditDatabase::SearchArc(const std::wstring& a, const std::wstring& b,
+                              const std::wstring& third, ArcType type) const {
     for (std::size_t i = 0; i < ArcList.size(); ++i) {
         const UNeditArc& arc = ArcList[i];
         const bool ends = (arc.GetStartPt() == a && arc.GetEndPt() == b) ||
                           (arc.GetStartPt() == b && arc.GetEndPt() == a);
-        if (ends && arc.GetThirdPt() == third && arc.GetArcType() == type) return static_cast<int>(i);
+        if (ends && arc.GetThirdPt() == third && arc.GetArcType() == type)
+            return static_cast<int>(i);
     }
     return -1;
 }

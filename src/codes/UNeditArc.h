@@ -8,12 +8,14 @@
 #include "platform/geometry/UWArc.h"
 
 class UNeditArc : public UWArc, public UNeditLinework {
-public:
+  public:
     UNeditArc() = default;
     /// From the three points' coordinates and names; `type` says how the third is read.
     UNeditArc(const UNeditPt& first, const UNeditPt& second, const UNeditPt& third, ArcType type)
         : UWArc(first, second, third, type),
-          StartPt(first.GetID()), EndPt(second.GetID()), ThirdPt(third.GetID()) {}
+          StartPt(first.GetID()),
+          EndPt(second.GetID()),
+          ThirdPt(third.GetID()) {}
     virtual ~UNeditArc() = default;
     UNeditArc(const UNeditArc&) = default;
     UNeditArc& operator=(const UNeditArc&) = default;
@@ -22,7 +24,7 @@ public:
     const std::wstring& GetEndPt() const { return EndPt; }
     const std::wstring& GetThirdPt() const { return ThirdPt; }
 
-private:
+  private:
     std::wstring StartPt;
     std::wstring EndPt;
     std::wstring ThirdPt;

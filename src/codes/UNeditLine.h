@@ -8,7 +8,7 @@
 #include "platform/geometry/UWLine.h"
 
 class UNeditLine : public UWLine, public UNeditLinework {
-public:
+  public:
     UNeditLine() = default;
     /// From `from` to `to`, with their coordinates and names.
     UNeditLine(const UNeditPt& from, const UNeditPt& to)
@@ -22,7 +22,7 @@ public:
     const std::wstring& GetFromPt() const { return FromPt; }
     const std::wstring& GetToPt() const { return ToPt; }
 
-private:
+  private:
     int StationLine = 0;
     std::wstring FromPt;
     std::wstring ToPt;

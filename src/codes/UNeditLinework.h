@@ -5,7 +5,7 @@
 #include <string>
 
 class UNeditLinework {
-public:
+  public:
     int GetColor() const { return Color; }
     void SetColor(int color) { Color = color; }
     const std::wstring& GetLayer() const { return Layer; }
@@ -19,7 +19,7 @@ public:
     const std::wstring& GetStringNo() const { return StringNo; }
     void SetStringNo(const std::wstring& name) { StringNo = name; }
 
-private:
+  private:
     int Color = 15;
     std::wstring Layer;
     int LineType = 0;

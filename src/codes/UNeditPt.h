@@ -23,7 +23,7 @@ struct UAttributeObject {
 };
 
 class UNeditPt : public UWPoint {
-public:
+  public:
     /// Flags: made by a PT record; derived by computation, so its height is not observed.
     static constexpr unsigned kFromPTRecord = 1u;
     static constexpr unsigned kInterpolated = 2u;
@@ -32,7 +32,8 @@ public:
     UNeditPt(const UWPoint& point, const std::wstring& id, unsigned flags);
     UNeditPt(const UWVector& vector, const std::wstring& id, unsigned flags);
     UNeditPt(double east, double north, const std::wstring& id, unsigned flags);
-    UNeditPt(const std::wstring& id, double east, double north, double height, const std::wstring& code, unsigned flags);
+    UNeditPt(const std::wstring& id, double east, double north, double height,
+             const std::wstring& code, unsigned flags);
     virtual ~UNeditPt() = default;
     UNeditPt(const UNeditPt&) = default;
     UNeditPt& operator=(const UNeditPt&) = default;
@@ -70,9 +71,10 @@ public:
     int GetPointAttributeSize() const { return static_cast<int>(Attributes.size()); }
     void SetImage(double number1, double number2, const std::wstring& file);
     /// Appends an attribute; refuses, adding nothing, an empty name.
-    bool SetPointAttribute(const std::wstring& name, const std::wstring& type, const std::wstring& value);
+    bool SetPointAttribute(const std::wstring& name, const std::wstring& type,
+                           const std::wstring& value);
 
-private:
+  private:
     std::wstring ID;
     std::wstring Code;
     std::wstring NewID;

@@ -4,7 +4,7 @@
 
 /// One interactive input.
 class XInput {
-public:
+  public:
     virtual ~XInput() = default;
     /// Ends the input with the command that ended it.
     virtual void Terminate(int command) = 0;
@@ -14,6 +14,6 @@ public:
 
 /// A pending option of the input framework; the document owns it once it is set.
 class XInputOption {
-public:
+  public:
     virtual ~XInputOption() = default;
 };

@@ -32,7 +32,8 @@ int UListCtrl::AddRecord(int row, const std::wstring& text) {
     if (row < 0 || row > GetItemCount()) row = GetItemCount();
     InsertRow(row, std::move(normalised));
     // A download adds a row at a time; rebuilding the form for each would only slow it.
-    if (form_ != nullptr && !IsAbortProcessOn()) ShowRecord(rows_[static_cast<std::size_t>(row)], row);
+    if (form_ != nullptr && !IsAbortProcessOn())
+        ShowRecord(rows_[static_cast<std::size_t>(row)], row);
     return row;
 }
 

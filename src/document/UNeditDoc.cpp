@@ -58,7 +58,9 @@ int UNeditDoc::OpenDocument(const std::wstring& name, UDocument* container) {
 int UNeditDoc::Load(UListCtrl* list) {
     UStorage* storage = GetStorage();
     UStreamFile stream;
-    if (list == nullptr || storage == nullptr || !stream.OpenStream(*storage, kNeutralDataStream, kReadMode)) return 0;
+    if (list == nullptr || storage == nullptr ||
+        !stream.OpenStream(*storage, kNeutralDataStream, kReadMode))
+        return 0;
     NeuText.clear();
     NamelessCoordinates coordinates;
     std::wstring line;
@@ -72,7 +74,8 @@ int UNeditDoc::Load(UListCtrl* list) {
             while (stream.ReadString(line)) ++rest;
             if (rest > 0) {
                 nedit::AppMessageBox(Host,
-                                     nedit::Translate(L"The records of {1} end at an empty line; {2} further lines were not read.",
+                                     nedit::Translate(L"The records of {1} end at an empty line; "
+                                                      L"{2} further lines were not read.",
                                                       {GetName(), std::to_wstring(rest)}),
                                      nedit::mb::IconExclamation);
             }
@@ -81,7 +84,8 @@ int UNeditDoc::Load(UListCtrl* list) {
         if (first) line = MakeUpperCaseString(line);
         first = false;
         line = coordinates.Complete(*this, GetRecordType(line), line);
-        if (list->AddRecord(list->GetItemCount(), line) >= 0) NeuText += list->GetItemText(list->GetItemCount() - 1) + L"\n";
+        if (list->AddRecord(list->GetItemCount(), line) >= 0)
+            NeuText += list->GetItemText(list->GetItemCount() - 1) + L"\n";
         if (GetAbortProcess()) break;
     }
     stream.Abort();
@@ -101,7 +105,8 @@ int UNeditDoc::Save(UListCtrl* list, int additionPoints) {
     }
     UStorage* storage = GetStorage();
     UStreamFile stream;
-    if (storage == nullptr || !stream.CreateStream(*storage, kNeutralDataStream, kCreateMode)) return 0;
+    if (storage == nullptr || !stream.CreateStream(*storage, kNeutralDataStream, kCreateMode))
+        return 0;
     if (list != nullptr) {
         NeuText.clear();
         for (const std::wstring& row : list->GetRows()) {
@@ -119,7 +124,8 @@ int UNeditDoc::Save(UListCtrl* list, int additionPoints) {
 int UNeditDoc::WriteSettingsStream() {
     UStorage* storage = GetStorage();
     UStreamFile stream;
-    if (storage == nullptr || !stream.CreateStream(*storage, kSettingsStream, kCreateMode)) return 0;
+    if (storage == nullptr || !stream.CreateStream(*storage, kSettingsStream, kCreateMode))
+        return 0;
     const std::string bytes = NeditSettings.Write();
     stream.Write(bytes.data(), bytes.size());
     stream.Close();
@@ -134,12 +140,15 @@ int UNeditDoc::Save(const std::wstring& path, const UListCtrl* list) const {
     return nedit::ReplaceFile(nedit::ToUtf8(path), text) ? 1 : 0;
 }
 
-int UNeditDoc::SaveData() { return Save(List.get(), 0); }
+int UNeditDoc::SaveData() {
+    return Save(List.get(), 0);
+}
 
 void UNeditDoc::CopyDocument(UNeditDoc& target) {
     UStorage* storage = GetStorage();
     std::string bytes;
-    if (storage != nullptr && storage->ReadStream(kNeutralDataStream, bytes)) target.NeuText += nedit::FromUtf8(bytes);
+    if (storage != nullptr && storage->ReadStream(kNeutralDataStream, bytes))
+        target.NeuText += nedit::FromUtf8(bytes);
     target.NeditSettings = NeditSettings;
 }
 
@@ -206,8 +215,9 @@ int UNeditDoc::RunEngine(UListCtrl* list) {
 
 void UNeditDoc::Regenerate(UListCtrl* list) {
     if (NReport &&
-        nedit::AppMessageBox(Host, nedit::Translate(L"Would you like to OVERWRITE the reduction REPORT ?"),
-                             nedit::mb::YesNo | nedit::mb::IconQuestion) == nedit::mb::IdYes) {
+        nedit::AppMessageBox(
+            Host, nedit::Translate(L"Would you like to OVERWRITE the reduction REPORT ?"),
+            nedit::mb::YesNo | nedit::mb::IconQuestion) == nedit::mb::IdYes) {
         NReport->Clear();
     }
     SetupDataBase(list);
@@ -221,7 +231,8 @@ std::wstring UNeditDoc::FormRecBuf(int recordType) const {
     return nedit::Format(L"%s %s", key, fields);
 }
 
-// ---- Report ---------------------------------------------------------------------------------------
+// ---- Report
+// ---------------------------------------------------------------------------------------
 
 int UNeditDoc::CreateNReport() {
     NReport = std::make_unique<UNeditReport>(this, kReportTitle);
@@ -234,13 +245,16 @@ void UNeditDoc::UpdateNReportTitle() {
     std::wstring job_title;
     if (SurveyDoc != nullptr) {
         const std::wstring path = nedit::FromUtf8(SurveyDoc->GetPathName());
-        job_title = path.substr(path.find_last_of(L"/\\") == std::wstring::npos ? 0 : path.find_last_of(L"/\\") + 1);
+        job_title = path.substr(
+            path.find_last_of(L"/\\") == std::wstring::npos ? 0 : path.find_last_of(L"/\\") + 1);
         job_title = job_title.substr(0, job_title.find(L" - "));
     }
     NReport->SetReportTitle(job_title + L" - " + kReportTitle + L" - " + GetName());
 }
 
-void UNeditDoc::ClearReport() { NReport.reset(); }
+void UNeditDoc::ClearReport() {
+    NReport.reset();
+}
 
 void UNeditDoc::UpdateDisplaySettings() {
     if (SurveyDoc != nullptr) Settings = SurveyDoc->GetSettings();
@@ -261,7 +275,8 @@ void UNeditDoc::SetAbortProcess(bool abort) {
     }
 }
 
-// ---- Inputs and commands ---------------------------------------------------------------------------
+// ---- Inputs and commands
+// ---------------------------------------------------------------------------
 
 int UNeditDoc::Push(XInput* input) {
     if (input == nullptr) return 0;
@@ -293,25 +308,51 @@ int UNeditDoc::OnCmdMsg(unsigned id, int code, void* extra) {
     auto terminate_top = [this](unsigned command) {
         if (XInput* top = Top()) top->Terminate(static_cast<int>(command));
     };
-    if (id == 32766 || id == 33572 || (id >= 33573 && id <= 33582) || id == 33584 || id == 33585 || id == 33589 ||
-        id == 33592 || id == 33593) {
+    if (id == 32766 || id == 33572 || (id >= 33573 && id <= 33582) || id == 33584 || id == 33585 ||
+        id == 33589 || id == 33592 || id == 33593) {
         terminate_top(id);
         return 1;
     }
     switch (id) {
-        case 32776: OnAbortModalOption(); return 1;
-        case 32777: OptionValueA = *static_cast<int*>(extra); return 1;
-        case 32778: *static_cast<int*>(extra) = OptionValueA; return 1;
-        case 32779: OptionValueB = *static_cast<int*>(extra); return 1;
-        case 32780: *static_cast<int*>(extra) = OptionValueB; return 1;
-        case 32781: *static_cast<std::vector<unsigned>**>(extra) = &OptionIdsB; return 1;
-        case 32782: *static_cast<std::vector<unsigned>**>(extra) = &OptionIdsA; return 1;
-        case 32968: return Push(static_cast<XInput*>(extra));
-        case 32969: *static_cast<XInput**>(extra) = Pop(); return 1;
-        case 32970: *static_cast<XInput**>(extra) = Top(); return 1;
-        case 32972: *static_cast<XInputOption**>(extra) = GetOption(); return 1;
-        case 32973: *static_cast<XInputOption**>(extra) = RemoveOption(); return 1;
-        case 32977: *static_cast<std::vector<XInput*>**>(extra) = &InputStack; return 1;
-        default: return 0;
+        case 32776:
+            OnAbortModalOption();
+            return 1;
+        case 32777:
+            OptionValueA = *static_cast<int*>(extra);
+            return 1;
+        case 32778:
+            *static_cast<int*>(extra) = OptionValueA;
+            return 1;
+        case 32779:
+            OptionValueB = *static_cast<int*>(extra);
+            return 1;
+        case 32780:
+            *static_cast<int*>(extra) = OptionValueB;
+            return 1;
+        case 32781:
+            *static_cast<std::vector<unsigned>**>(extra) = &OptionIdsB;
+            return 1;
+        case 32782:
+            *static_cast<std::vector<unsigned>**>(extra) = &OptionIdsA;
+            return 1;
+        case 32968:
+            return Push(static_cast<XInput*>(extra));
+        case 32969:
+            *static_cast<XInput**>(extra) = Pop();
+            return 1;
+        case 32970:
+            *static_cast<XInput**>(extra) = Top();
+            return 1;
+        case 32972:
+            *static_cast<XInputOption**>(extra) = GetOption();
+            return 1;
+        case 32973:
+            *static_cast<XInputOption**>(extra) = RemoveOption();
+            return 1;
+        case 32977:
+            *static_cast<std::vector<XInput*>**>(extra) = &InputStack;
+            return 1;
+        default:
+            return 0;
     }
 }

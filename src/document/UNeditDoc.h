@@ -33,7 +33,7 @@ class DialogHost;
 }
 
 class UNeditDoc : public UDocument, public UNeutralFileFormat {
-public:
+  public:
     static constexpr const wchar_t* kNeutralDataStream = L"NeutralData";
     static constexpr const wchar_t* kSettingsStream = L"Settings";
     /// Stream modes: exclusive read-write to read, create-exclusive-write to write.
@@ -124,7 +124,7 @@ public:
     /// `extra` carries a value in or out, as the command's kind says.
     int OnCmdMsg(unsigned id, int code, void* extra);
 
-private:
+  private:
     void TakeJobUnits();
     int WriteSettingsStream();
     void StartEngine(UListCtrl* list);

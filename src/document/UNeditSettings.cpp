@@ -4,7 +4,9 @@
 
 namespace {
 // The kind each value is stored as: flags are kind 1, the text size kind 4.
-int KindOf(int id) { return id == UNeditSettings::TextSize ? 4 : 1; }
+int KindOf(int id) {
+    return id == UNeditSettings::TextSize ? 4 : 1;
+}
 }  // namespace
 
 std::string UNeditSettings::Write() const {
@@ -24,8 +26,8 @@ bool UNeditSettings::Read(const std::string& text) {
         std::istringstream fields(line);
         int id = 0, kind = 0, value = 0;
         char comma1 = 0, comma2 = 0;
-        if (!(fields >> id >> comma1 >> kind >> comma2 >> value) || comma1 != ',' || comma2 != ',' ||
-            id < ShowPoints || id > TextSize) {
+        if (!(fields >> id >> comma1 >> kind >> comma2 >> value) || comma1 != ',' ||
+            comma2 != ',' || id < ShowPoints || id > TextSize) {
             return false;
         }
         read[static_cast<std::size_t>(id - 1)] = value;

@@ -6,9 +6,17 @@
 #include <string>
 
 class UNeditSettings {
-public:
+  public:
     /// Dictionary ids of the values.
-    enum Id { ShowPoints = 1, ShowLines, ShowSymbols, ShowLineStyles, ShowPointNumbers, ShowPointCodes, TextSize };
+    enum Id {
+        ShowPoints = 1,
+        ShowLines,
+        ShowSymbols,
+        ShowLineStyles,
+        ShowPointNumbers,
+        ShowPointCodes,
+        TextSize
+    };
 
     int Get(Id id) const { return Values[static_cast<std::size_t>(id - 1)]; }
     void Set(Id id, int value) { Values[static_cast<std::size_t>(id - 1)] = value; }
@@ -19,7 +27,7 @@ public:
     /// that is not of that form, with nothing changed.
     bool Read(const std::string& text);
 
-private:
+  private:
     // Show points and lines; no symbols, line styles, numbers or codes; normal text.
     std::array<int, 7> Values{1, 1, 0, 0, 0, 0, 0};
 };

@@ -12,7 +12,9 @@ URawDataContainer::URawDataContainer(USurveyDoc* job) : Job(job) {}
 
 URawDataContainer::~URawDataContainer() = default;
 
-int URawDataContainer::Open() { return OpenDocument(kStorageName, Job); }
+int URawDataContainer::Open() {
+    return OpenDocument(kStorageName, Job);
+}
 
 int URawDataContainer::OpenDocument(const std::wstring& name, UDocument* job) {
     Documents.clear();
@@ -65,7 +67,8 @@ std::wstring URawDataContainer::GetUntitledName() const {
     return nedit::Format(L"Data%d", FirstFreeNumber(L"Data", kNameLimit - 1));
 }
 
-int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseName, const std::wstring& path,
+int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseName,
+                                                     const std::wstring& path,
                                                      std::wstring* createdName) {
     const std::wstring base = baseName.empty() ? std::wstring(L"Data") : baseName;
     const int number = FirstFreeNumber(base, kNameLimit);
@@ -112,7 +115,8 @@ bool URawDataContainer::DeleteNeditDoc(const std::wstring& name) {
     return Delete(name) && Commit();
 }
 
-bool URawDataContainer::RenameNeditDoc(const std::wstring& newName, const std::wstring& oldName, int /*flag*/) {
+bool URawDataContainer::RenameNeditDoc(const std::wstring& newName, const std::wstring& oldName,
+                                       int /*flag*/) {
     if (GetNeditDoc(newName) != nullptr) return false;
     UNeditDoc* old_doc = GetNeditDoc(oldName);
     if (old_doc == nullptr) return false;

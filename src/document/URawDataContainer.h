@@ -13,7 +13,7 @@
 class USurveyDoc;
 
 class URawDataContainer : public UDocument {
-public:
+  public:
     static constexpr const wchar_t* kStorageName = L"RawData";
     /// Names are "Data%d" and the like; no number reaches this.
     static constexpr int kNameLimit = 1024;
@@ -45,7 +45,7 @@ public:
     /// Copies every document into `target`, a container of `targetSurvey`.
     void CopyDocument(URawDataContainer& target, USurveyDoc* targetSurvey);
 
-private:
+  private:
     /// The names of the documents and of every element of the container's storage.
     std::set<std::wstring> TakenNames() const;
     /// The lowest number from 1 that makes `base` and it a free name; `last` when none below.

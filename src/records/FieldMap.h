@@ -9,7 +9,7 @@
 #include <vector>
 
 class FieldMap {
-public:
+  public:
     using Entry = std::pair<int, std::wstring>;
     using const_iterator = std::vector<Entry>::const_iterator;
     using iterator = std::vector<Entry>::iterator;
@@ -30,7 +30,7 @@ public:
     /// The value of `id`, made empty when the map did not have it.
     std::wstring& operator[](int id);
 
-private:
+  private:
     std::vector<Entry> entries_;
     std::size_t used_ = 0;
 };

@@ -8,12 +8,12 @@
 class UNeutralFileFormat;
 
 class NamelessCoordinates {
-public:
+  public:
     /// The row as it goes into the list: a coordinate record of at most two commas gets the
     /// ID field of the last station or back-bearing record before it (an empty one before
     /// any), other rows stay as they are.
     std::wstring Complete(const UNeutralFileFormat& format, int type, const std::wstring& row);
 
-private:
+  private:
     std::wstring IdText;
 };

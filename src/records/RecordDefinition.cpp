@@ -9,8 +9,8 @@ namespace {
 
 bool ParseKind(const std::wstring& word, FieldKind& kind) {
     static const std::unordered_map<std::wstring, FieldKind> kKinds = {
-        {L"text", FieldKind::Text},     {L"angle", FieldKind::Angle},
-        {L"length", FieldKind::Length}, {L"number", FieldKind::Number},
+        {L"text", FieldKind::Text},       {L"angle", FieldKind::Angle},
+        {L"length", FieldKind::Length},   {L"number", FieldKind::Number},
         {L"integer", FieldKind::Integer},
     };
     const auto found = kKinds.find(word);

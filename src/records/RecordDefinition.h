@@ -28,7 +28,7 @@ struct RecordDefinition {
 };
 
 class RecordDefinitionTable {
-public:
+  public:
     /// Reads the definition text. Gives false and a message naming the line when a line
     /// is not understood; the table is then left empty.
     bool Parse(const std::wstring& text, std::wstring& error);
@@ -43,7 +43,7 @@ public:
     const FieldDefinition* FieldById(int id) const;
     const FieldDefinition* FieldByKey(const std::wstring& key) const;
 
-private:
+  private:
     bool ParseLine(const std::vector<std::wstring>& words, std::wstring& error);
     void AddField(FieldDefinition field);
 

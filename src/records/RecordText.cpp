@@ -11,11 +11,14 @@ std::wstring GetDelimToken(std::wstring_view text, int n, std::wstring_view deli
         start = separator + 1;
     }
     const std::size_t end = text.find_first_of(delimiters, start);
-    const std::size_t length = end == std::wstring_view::npos ? std::wstring_view::npos : end - start;
+    const std::size_t length =
+        end == std::wstring_view::npos ? std::wstring_view::npos : end - start;
     return nedit::ToUpper(nedit::Trim(text.substr(start, length)));
 }
 
-std::wstring GetToken(std::wstring_view text, int n) { return GetDelimToken(text, n, L" ,"); }
+std::wstring GetToken(std::wstring_view text, int n) {
+    return GetDelimToken(text, n, L" ,");
+}
 
 std::wstring ReplaceToken(std::wstring_view record, int n, std::wstring_view value) {
     if (n < 0) return std::wstring(record);
@@ -38,7 +41,8 @@ std::wstring ReplaceToken(std::wstring_view record, int n, std::wstring_view val
         // The key and the blanks that pad it stay; the first field is what is replaced.
         const std::size_t blank = record.find(L' ');
         const std::size_t comma = record.find(L',');
-        if (blank != std::wstring_view::npos && (comma == std::wstring_view::npos || blank < comma)) {
+        if (blank != std::wstring_view::npos &&
+            (comma == std::wstring_view::npos || blank < comma)) {
             const std::size_t field = record.find_first_not_of(L' ', blank);
             out.assign(record.substr(0, field == std::wstring_view::npos ? record.size() : field));
         }
@@ -54,7 +58,8 @@ std::wstring GetIdText(std::wstring_view record) {
     if (comma == std::wstring_view::npos) {
         const std::size_t blank = record.find(L' ');
         // A formatted row pads its key with blanks; the text meant is the field after them.
-        return blank == std::wstring_view::npos ? std::wstring() : nedit::TrimLeft(record.substr(blank + 1));
+        return blank == std::wstring_view::npos ? std::wstring()
+                                                : nedit::TrimLeft(record.substr(blank + 1));
     }
     const std::size_t blank = record.rfind(L' ', comma);
     const std::size_t start = blank == std::wstring_view::npos ? 0 : blank + 1;
@@ -68,8 +73,15 @@ int GetAngleType(std::wstring_view row) {
     while (i < row.size() && row[i] == L' ') ++i;
     if (i >= row.size()) return 0;
     switch (row[i]) {
-        case L'1': case L'D': case L'd': return 1;
-        case L'2': case L'G': case L'g': return 2;
-        default: return 0;
+        case L'1':
+        case L'D':
+        case L'd':
+            return 1;
+        case L'2':
+        case L'G':
+        case L'g':
+            return 2;
+        default:
+            return 0;
     }
 }

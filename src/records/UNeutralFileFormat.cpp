@@ -13,7 +13,9 @@ namespace {
 
 constexpr const wchar_t* kDefinitionFileName = L"NeutralRecords.def";
 
-bool IsControl(wchar_t c) { return (c >= 0 && c < 0x20) || c == 0x7F; }
+bool IsControl(wchar_t c) {
+    return (c >= 0 && c < 0x20) || c == 0x7F;
+}
 
 // The key of a record: its text up to the first blank or comma, in upper case.
 std::wstring KeyOf(std::wstring_view text) {
@@ -22,11 +24,15 @@ std::wstring KeyOf(std::wstring_view text) {
 
 int WinTypeOf(FieldKind kind) {
     switch (kind) {
-        case FieldKind::Integer: return 1;
+        case FieldKind::Integer:
+            return 1;
         case FieldKind::Length:
-        case FieldKind::Number: return 3;
-        case FieldKind::Angle: return 7;
-        default: return 6;
+        case FieldKind::Number:
+            return 3;
+        case FieldKind::Angle:
+            return 7;
+        default:
+            return 6;
     }
 }
 
@@ -36,7 +42,9 @@ UNeutralFileFormat::UNeutralFileFormat(const UJobSettings* settings) : settings_
 
 UNeutralFileFormat::~UNeutralFileFormat() = default;
 
-void UNeutralFileFormat::InitMaps() { current_values_.clear(); }
+void UNeutralFileFormat::InitMaps() {
+    current_values_.clear();
+}
 
 void UNeutralFileFormat::ClearMaps() {
     definition_.Clear();
@@ -171,7 +179,8 @@ int UNeutralFileFormat::ProcessRecord(int type, const std::wstring& line, FieldM
         std::wstring_view value = token;
         if (equals != std::wstring_view::npos) {
             // A key that the definition does not know is passed over, not guessed at.
-            field = definition_.FieldByKey(nedit::ToUpper(nedit::TrimView(token.substr(0, equals))));
+            field =
+                definition_.FieldByKey(nedit::ToUpper(nedit::TrimView(token.substr(0, equals))));
             value = nedit::TrimView(token.substr(equals + 1));
         } else if (position < record->fields.size() && !token.empty()) {
             field = definition_.FieldById(record->fields[position]);
@@ -181,16 +190,19 @@ int UNeutralFileFormat::ProcessRecord(int type, const std::wstring& line, FieldM
     return 1;
 }
 
-void UNeutralFileFormat::StoreField(int id, FieldKind kind, std::wstring_view text, FieldMap& fields) {
+void UNeutralFileFormat::StoreField(int id, FieldKind kind, std::wstring_view text,
+                                    FieldMap& fields) {
     std::wstring& value = fields[id];
     ReadValue(kind, text, value);
     if (!value.empty()) current_values_[id] = value;
 }
 
-void UNeutralFileFormat::ReadValue(FieldKind kind, std::wstring_view text, std::wstring& value) const {
-    const bool converted = !text.empty() &&
-                           ((kind == FieldKind::Angle && FileAngleUnit() != nedit::AngleUnit::Degrees) ||
-                            (kind == FieldKind::Length && FileLengthUnit() != WorkingLengthUnit()));
+void UNeutralFileFormat::ReadValue(FieldKind kind, std::wstring_view text,
+                                   std::wstring& value) const {
+    const bool converted =
+        !text.empty() &&
+        ((kind == FieldKind::Angle && FileAngleUnit() != nedit::AngleUnit::Degrees) ||
+         (kind == FieldKind::Length && FileLengthUnit() != WorkingLengthUnit()));
     if (!converted) {
         value.assign(text);
     } else if (kind == FieldKind::Angle) {
@@ -235,11 +247,13 @@ std::wstring UNeutralFileFormat::FormatRecord(int /*type*/, const std::wstring& 
     return out;
 }
 
-std::wstring UNeutralFileFormat::ReformatRecord(const std::wstring& record, const std::wstring& id) const {
+std::wstring UNeutralFileFormat::ReformatRecord(const std::wstring& record,
+                                                const std::wstring& id) const {
     const std::size_t comma = record.find(L',');
     if (comma == std::wstring::npos) return record;
     const std::size_t first_blank = record.find(L' ');
-    const std::wstring key = nedit::ToUpper(nedit::Trim(std::wstring_view(record).substr(0, first_blank)));
+    const std::wstring key =
+        nedit::ToUpper(nedit::Trim(std::wstring_view(record).substr(0, first_blank)));
     const std::size_t last_blank = record.rfind(L' ', comma);
     const std::size_t rest = last_blank == std::wstring::npos ? 0 : last_blank + 1;
     return nedit::Format(L"%-10s%s,%s", key, id, std::wstring_view(record).substr(rest));
@@ -259,9 +273,13 @@ const std::wstring& UNeutralFileFormat::GetCurrentValue(int id) const {
     return found == current_values_.end() ? kNone : found->second;
 }
 
-void UNeutralFileFormat::SetCurrentValue(int id, const std::wstring& value) { current_values_[id] = value; }
+void UNeutralFileFormat::SetCurrentValue(int id, const std::wstring& value) {
+    current_values_[id] = value;
+}
 
-void UNeutralFileFormat::ResetCurrentValues() { current_values_.clear(); }
+void UNeutralFileFormat::ResetCurrentValues() {
+    current_values_.clear();
+}
 
 void UNeutralFileFormat::InitUnitsAndAngleModes(wchar_t& angle, wchar_t& length, wchar_t& hmode,
                                                 wchar_t& vmode) const {
@@ -273,9 +291,12 @@ void UNeutralFileFormat::InitUnitsAndAngleModes(wchar_t& angle, wchar_t& length,
 
 double UNeutralFileFormat::ConvertToZenithVA(double reading) const {
     switch (CurrentLetter(fld::VMode, L'Z')) {
-        case L'N': return 180.0 - reading;
-        case L'A': return 90.0 - reading;
-        default: return reading;
+        case L'N':
+            return 180.0 - reading;
+        case L'A':
+            return 90.0 - reading;
+        default:
+            return reading;
     }
 }
 
@@ -284,10 +305,13 @@ double UNeutralFileFormat::ConvertDist(double value, bool to_file) const {
                    : nedit::ConvertLength(value, FileLengthUnit(), WorkingLengthUnit());
 }
 
-double UNeutralFileFormat::ConvertAngle(double value) const { return nedit::ToDegrees(value, FileAngleUnit()); }
+double UNeutralFileFormat::ConvertAngle(double value) const {
+    return nedit::ToDegrees(value, FileAngleUnit());
+}
 
 double UNeutralFileFormat::ConvertToAngleDisplayUnit(double degrees) const {
-    return nedit::FromDegrees(degrees, settings_ ? settings_->GetAngleUnit() : nedit::AngleUnit::DegMinSec);
+    return nedit::FromDegrees(degrees,
+                              settings_ ? settings_->GetAngleUnit() : nedit::AngleUnit::DegMinSec);
 }
 
 nedit::LengthUnit UNeutralFileFormat::WorkingLengthUnit() const {
@@ -295,11 +319,13 @@ nedit::LengthUnit UNeutralFileFormat::WorkingLengthUnit() const {
 }
 
 nedit::LengthUnit UNeutralFileFormat::FileLengthUnit() const {
-    return nedit::LengthUnitFromLetter(CurrentLetter(fld::UL, nedit::LetterOf(WorkingLengthUnit())));
+    return nedit::LengthUnitFromLetter(
+        CurrentLetter(fld::UL, nedit::LetterOf(WorkingLengthUnit())));
 }
 
 nedit::AngleUnit UNeutralFileFormat::FileAngleUnit() const {
-    const wchar_t job = nedit::LetterOf(settings_ ? settings_->GetAngleUnit() : nedit::AngleUnit::DegMinSec);
+    const wchar_t job =
+        nedit::LetterOf(settings_ ? settings_->GetAngleUnit() : nedit::AngleUnit::DegMinSec);
     return nedit::AngleUnitFromLetter(CurrentLetter(fld::UA, job));
 }
 

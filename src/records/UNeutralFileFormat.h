@@ -17,7 +17,7 @@
 #include "records/RecordDefinition.h"
 
 class UNeutralFileFormat {
-public:
+  public:
     /// Binds the service to the job's settings, from which the working units are read.
     /// The settings must outlive the service; without them metres and ddd.mmss hold.
     explicit UNeutralFileFormat(const UJobSettings* settings);
@@ -86,7 +86,8 @@ public:
     void ResetCurrentValues();
 
     /// The job's angle and length letters, and the start modes "A" and "Z".
-    void InitUnitsAndAngleModes(wchar_t& angle, wchar_t& length, wchar_t& hmode, wchar_t& vmode) const;
+    void InitUnitsAndAngleModes(wchar_t& angle, wchar_t& length, wchar_t& hmode,
+                                wchar_t& vmode) const;
     /// A vertical reading in degrees, in the current vertical mode, as a zenith angle:
     /// "Z" zenith as it is, "N" nadir (180 - v), "A" above the horizon (90 - v).
     double ConvertToZenithVA(double reading) const;
@@ -106,7 +107,7 @@ public:
     wchar_t GetHModeLetter() const { return CurrentLetter(819, L'A'); }
     wchar_t GetVModeLetter() const { return CurrentLetter(820, L'Z'); }
 
-private:
+  private:
     nedit::LengthUnit WorkingLengthUnit() const;
     nedit::LengthUnit FileLengthUnit() const;
     nedit::AngleUnit FileAngleUnit() const;

@@ -49,11 +49,17 @@ void AverageTarget(const UNeditDatabase& engine, SSSTRUCT& target) {
 
 }  // namespace
 
-int UNeditDatabase::CheckFace(double zenith) { return zenith > 180.0 && zenith < 360.0 ? 2 : 1; }
+int UNeditDatabase::CheckFace(double zenith) {
+    return zenith > 180.0 && zenith < 360.0 ? 2 : 1;
+}
 
-double UNeditDatabase::chgface(double hAng) { return UAngle::ValidateData(hAng + 180.0); }
+double UNeditDatabase::chgface(double hAng) {
+    return UAngle::ValidateData(hAng + 180.0);
+}
 
-double UNeditDatabase::chgVaface(double zenith) { return 360.0 - zenith; }
+double UNeditDatabase::chgVaface(double zenith) {
+    return 360.0 - zenith;
+}
 
 double UNeditDatabase::AngleDiff(double from, double to) {
     if (from > to) to += 360.0;
@@ -65,7 +71,8 @@ double UNeditDatabase::chgDeg(double dddmmss) {
     long degrees = static_cast<long>(magnitude);
     const double minutes_and_rest = (magnitude - static_cast<double>(degrees)) * 100.0;
     long minutes = static_cast<long>(minutes_and_rest);
-    long seconds = static_cast<long>((minutes_and_rest - static_cast<double>(minutes)) * 100.0 + 0.5);
+    long seconds =
+        static_cast<long>((minutes_and_rest - static_cast<double>(minutes)) * 100.0 + 0.5);
     // The carries happen at 100, as the field programs have always done.
     if (seconds > 99) {
         minutes += 1;
@@ -110,7 +117,8 @@ int UNeditDatabase::FindAverageMeas(const MeasurementList& measurements, double&
 
 int UNeditDatabase::ProcessAverageMeas() {
     std::size_t steps = 0;
-    for (const auto& station : Stations) steps += 1 + station->SSList.size() + station->FSList.size();
+    for (const auto& station : Stations)
+        steps += 1 + station->SSList.size() + station->FSList.size();
     std::size_t done = 0;
     for (const auto& station : Stations) {
         if (AbortRequested()) return 0;

@@ -8,7 +8,7 @@ class DialogHost;
 }
 
 class CError {
-public:
+  public:
     /// The message of a code; empty for 0 and for -11 (the user cancelled), which show none.
     static std::wstring MessageOf(int code);
     /// Shows the code's message, translated, with the error icon, when it has one.

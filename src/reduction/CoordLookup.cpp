@@ -18,16 +18,21 @@ namespace {
 // An empty name in the bearing store stands as this text, so it has a key like any other.
 constexpr const wchar_t* kNoName = L"-99999";
 
-std::wstring BearingKey(const std::wstring& from, const std::wstring& to) { return from + L'\x1f' + to; }
+std::wstring BearingKey(const std::wstring& from, const std::wstring& to) {
+    return from + L'\x1f' + to;
+}
 
-double Reverse(double bearing) { return UAngle::ValidateData(bearing + 180.0); }
+double Reverse(double bearing) {
+    return UAngle::ValidateData(bearing + 180.0);
+}
 
 }  // namespace
 
 int UNeditDatabase::findCoord(const std::wstring& name, double& e, double& n, double& z,
                               std::wstring& code, int fix, bool askUser) {
     {
-        for (const STNSTRUCT* station = FirstNamed(name); station != nullptr; station = station->NextSameName) {
+        for (const STNSTRUCT* station = FirstNamed(name); station != nullptr;
+             station = station->NextSameName) {
             if (!station->CoordKnown) {
                 code = station->StnCode;
                 continue;
@@ -81,15 +86,16 @@ int UNeditDatabase::findCoord(const std::wstring& name, double& e, double& n, do
     return 1;
 }
 
-int UNeditDatabase::getCoord(const std::wstring& name, double* e, double* n, double* z, std::wstring& code,
-                             int clear, bool showDialog) {
+int UNeditDatabase::getCoord(const std::wstring& name, double* e, double* n, double* z,
+                             std::wstring& code, int clear, bool showDialog) {
     if (ErrorCode != 0 && GetError() != 0) return 0;
     if (clear) {
         *e = *n = 0.0;
         *z = kNoHeight;
         code.clear();
     }
-    UCoordEntryDlg dialog(CoordsOrderXY() ? UCoordEntryDlg::kEastFirstId : UCoordEntryDlg::kNorthFirstId, Host);
+    UCoordEntryDlg dialog(
+        CoordsOrderXY() ? UCoordEntryDlg::kEastFirstId : UCoordEntryDlg::kNorthFirstId, Host);
     dialog.SetName(name);
 
     double job_e = 0.0, job_n = 0.0, job_z = kNoHeight;
@@ -117,7 +123,8 @@ int UNeditDatabase::getCoord(const std::wstring& name, double* e, double* n, dou
         if (GetPointFromPtList(name, pe, pn, pz, point_code, 0)) {
             dialog.InitXYZLocal(pe, pn, pz, point_code);
         } else {
-            dialog.InitXYZLocal(known->second.East, known->second.North, known->second.Height, code);
+            dialog.InitXYZLocal(known->second.East, known->second.North, known->second.Height,
+                                code);
         }
     }
     const int answer = showDialog ? dialog.process(name, UseForAll) : dialog.ProcessOnly(name);
@@ -134,8 +141,8 @@ int UNeditDatabase::getCoord(const std::wstring& name, double* e, double* n, dou
     return 1;
 }
 
-int UNeditDatabase::setCoord(const std::wstring& name, double e, double n, double z, const std::wstring& code,
-                             int flags, int fix, int ptFlag) {
+int UNeditDatabase::setCoord(const std::wstring& name, double e, double n, double z,
+                             const std::wstring& code, int flags, int fix, int ptFlag) {
     if (name.empty()) return 0;
     if (STNSTRUCT* first = FirstNamed(name)) {
         bool written = false;
@@ -174,7 +181,8 @@ int UNeditDatabase::setCoord(const std::wstring& name, double e, double n, doubl
 
 int UNeditDatabase::GetCoordFromStnList(const std::wstring& name, double& e, double& n, double& z,
                                         std::wstring& code) const {
-    for (const STNSTRUCT* station = FirstNamed(name); station != nullptr; station = station->NextSameName) {
+    for (const STNSTRUCT* station = FirstNamed(name); station != nullptr;
+         station = station->NextSameName) {
         if (!station->CoordKnown) continue;
         e = station->East;
         n = station->North;
@@ -197,13 +205,14 @@ int UNeditDatabase::GetPointFromPtList(const std::wstring& name, double& e, doub
     return mode == 1 && point.IsPTRecord() ? 0 : 1;
 }
 
-int UNeditDatabase::FindCoordinateRow(const std::wstring& name, bool coordinates, int type, double* e,
-                                      double* n, double* z) {
+int UNeditDatabase::FindCoordinateRow(const std::wstring& name, bool coordinates, int type,
+                                      double* e, double* n, double* z) {
     if (ListCtrl == nullptr || Doc == nullptr) return -1;
     for (int row = 0; row < ListCtrl->GetItemCount(); ++row) {
         const std::wstring text = nedit::ToUpper(nedit::TrimView(ListCtrl->GetItemText(row)));
         const int row_type = Doc->GetRecordType(text);
-        const bool wanted = coordinates ? (row_type == rec::Xyz || row_type == rec::Yxz) : row_type == type;
+        const bool wanted =
+            coordinates ? (row_type == rec::Xyz || row_type == rec::Yxz) : row_type == type;
         if (!wanted || !Doc->ProcessRecord(row_type, text, Fields)) continue;
         if (GetValue(fld::ID) != name) continue;
         if (coordinates) {
@@ -224,7 +233,8 @@ int UNeditDatabase::FindRecord(int type, const std::wstring& name) {
     return FindCoordinateRow(name, false, type, nullptr, nullptr, nullptr);
 }
 
-std::wstring UNeditDatabase::FormatXYZRecord(const std::wstring& name, double e, double n, double z) const {
+std::wstring UNeditDatabase::FormatXYZRecord(const std::wstring& name, double e, double n,
+                                             double z) const {
     std::wstring key = L"XYZ", id = L"ID", east = L"E", north = L"N", height = L"H";
     if (Doc != nullptr) {
         Doc->FindRecordKey(rec::Xyz, key);
@@ -236,10 +246,12 @@ std::wstring UNeditDatabase::FormatXYZRecord(const std::wstring& name, double e,
         n = Doc->ConvertDist(n, true);
         z = Doc->ConvertDist(z, true);
     }
-    return nedit::Format(L"%-8s %s=%s,%s=%.3f,%s=%.3f,%s=%.3f", key, id, name, east, e, north, n, height, z);
+    return nedit::Format(L"%-8s %s=%s,%s=%.3f,%s=%.3f,%s=%.3f", key, id, name, east, e, north, n,
+                         height, z);
 }
 
-std::wstring UNeditDatabase::FormatBKBRecord(const std::wstring& name, double reading, double bearing) const {
+std::wstring UNeditDatabase::FormatBKBRecord(const std::wstring& name, double reading,
+                                             double bearing) const {
     std::wstring key = L"BKB", id = L"ID", circle = L"HA", back = L"BRG";
     int decimals = 4;
     if (Doc != nullptr) {
@@ -251,7 +263,8 @@ std::wstring UNeditDatabase::FormatBKBRecord(const std::wstring& name, double re
         bearing = Doc->ConvertToAngleDisplayUnit(bearing);
         if (Doc->GetJobSettings() != nullptr) decimals = Doc->GetJobSettings()->GetAngleDecimals();
     }
-    const std::wstring format = nedit::Format(L"%%-8s %%s=%%s,%%s=%%.%df,%%s=%%.%df", decimals, decimals);
+    const std::wstring format =
+        nedit::Format(L"%%-8s %%s=%%s,%%s=%%.%df,%%s=%%.%df", decimals, decimals);
     return nedit::Format(format, key, id, name, circle, reading, back, bearing);
 }
 
@@ -265,7 +278,8 @@ double UNeditDatabase::GetBearingFromArray(std::wstring from, std::wstring to) c
     return direction == 1 ? stored : Reverse(stored);
 }
 
-int UNeditDatabase::GetBearingArray(const std::wstring& from, const std::wstring& to, int& direction) const {
+int UNeditDatabase::GetBearingArray(const std::wstring& from, const std::wstring& to,
+                                    int& direction) const {
     const auto as_stored = BearingIndex.find(BearingKey(from, to));
     const auto reversed = BearingIndex.find(BearingKey(to, from));
     const std::size_t none = LineBearings.size();
@@ -294,7 +308,8 @@ int UNeditDatabase::InsertBearingArray(std::wstring from, std::wstring to, doubl
         LineBearings.push_back({from, to, bearing});
         return static_cast<int>(LineBearings.size()) - 1;
     }
-    LineBearings[static_cast<std::size_t>(index)].Bearing = direction == 1 ? bearing : Reverse(bearing);
+    LineBearings[static_cast<std::size_t>(index)].Bearing =
+        direction == 1 ? bearing : Reverse(bearing);
     return index;
 }
 
@@ -303,7 +318,8 @@ std::wstring UNeditDatabase::BearingFileName() const {
     const std::size_t dot = FileName.rfind(L'.');
     const std::size_t slash = FileName.find_last_of(L"/\\");
     // A name without an extension gets one.
-    if (dot == std::wstring::npos || (slash != std::wstring::npos && dot < slash)) return FileName + L".$BR";
+    if (dot == std::wstring::npos || (slash != std::wstring::npos && dot < slash))
+        return FileName + L".$BR";
     return FileName.substr(0, dot) + L".$BR";
 }
 
@@ -316,7 +332,8 @@ int UNeditDatabase::LoadBearingArray() {
         const std::wstring text = nedit::DecodeTextLine(line);
         const std::size_t first = text.find(L',');
         const std::size_t second = first == std::wstring::npos ? first : text.find(L',', first + 1);
-        if (second == std::wstring::npos || text.find(L',', second + 1) != std::wstring::npos) continue;
+        if (second == std::wstring::npos || text.find(L',', second + 1) != std::wstring::npos)
+            continue;
         InsertBearingArray(text.substr(0, first), text.substr(first + 1, second - first - 1),
                            nedit::TextToDouble(text.substr(second + 1)));
     }
@@ -329,7 +346,8 @@ int UNeditDatabase::SaveBearingArray() const {
     std::ofstream file(nedit::ToUtf8(path), std::ios::binary | std::ios::trunc);
     if (!file) return 0;
     for (const ULINEBEAR_STRUCT& entry : LineBearings) {
-        file << nedit::ToUtf8(nedit::Format(L"%s,%s,%.8f\n", entry.FromName, entry.ToName, entry.Bearing));
+        file << nedit::ToUtf8(
+            nedit::Format(L"%s,%s,%.8f\n", entry.FromName, entry.ToName, entry.Bearing));
     }
     return file.good() ? 1 : 0;
 }

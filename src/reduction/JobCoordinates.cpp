@@ -23,4 +23,6 @@ int UNeditDatabase::GetCoordFromSvyDoc(const std::wstring& name, double& e, doub
     return 1;
 }
 
-bool UNeditDatabase::CoordsOrderXY() const { return SurveyDoc == nullptr || SurveyDoc->CoordsOrderXY(); }
+bool UNeditDatabase::CoordsOrderXY() const {
+    return SurveyDoc == nullptr || SurveyDoc->CoordsOrderXY();
+}

@@ -24,7 +24,8 @@ int UNeditDatabase::LoadNeFile(const std::wstring& path) {
 
     nedit::LineReader reader;
     if (!reader.Open(nedit::ToUtf8(path))) {
-        nedit::AppMessageBox(Host, nedit::Translate(L"Failed to open {1}.", {path}), nedit::mb::IconStop);
+        nedit::AppMessageBox(Host, nedit::Translate(L"Failed to open {1}.", {path}),
+                             nedit::mb::IconStop);
         return 0;
     }
 
@@ -34,7 +35,8 @@ int UNeditDatabase::LoadNeFile(const std::wstring& path) {
     std::string bytes;
     for (int lines_read = 0; reader.ReadLine(bytes); ++lines_read) {
         if (lines_read % kProgressEvery == 0 && reader.Size() > 0) {
-            UpdateProgress(static_cast<unsigned>(100 * reader.Position() / reader.Size()), L"Loading");
+            UpdateProgress(static_cast<unsigned>(100 * reader.Position() / reader.Size()),
+                           L"Loading");
         }
         const std::wstring decoded = nedit::DecodeTextLine(bytes);
         const std::wstring_view trimmed = nedit::TrimView(decoded);

@@ -2,7 +2,9 @@
 
 namespace {
 
-std::size_t HashOf(const std::wstring& name) { return std::hash<std::wstring>()(name); }
+std::size_t HashOf(const std::wstring& name) {
+    return std::hash<std::wstring>()(name);
+}
 
 // Tables are a power of two in size and kept at most half full.
 std::size_t CapacityFor(std::size_t count) {
@@ -17,7 +19,8 @@ std::size_t NameIndex::SlotOf(const std::wstring& name, std::size_t hash) const 
     const std::size_t mask = Slots.size() - 1;
     for (std::size_t i = hash & mask;; i = (i + 1) & mask) {
         const Slot& slot = Slots[i];
-        if (slot.Position == npos || (slot.Hash == hash && NameAt_(slot.Position) == name)) return i;
+        if (slot.Position == npos || (slot.Hash == hash && NameAt_(slot.Position) == name))
+            return i;
     }
 }
 

@@ -9,7 +9,7 @@
 #include <vector>
 
 class NameIndex {
-public:
+  public:
     static constexpr std::size_t npos = static_cast<std::size_t>(-1);
     /// Gives the name held at a position of the store.
     using NameAt = std::function<const std::wstring&(std::size_t)>;
@@ -25,7 +25,7 @@ public:
     void Reserve(std::size_t count);
     std::size_t Size() const { return Used; }
 
-private:
+  private:
     struct Slot {
         std::size_t Hash = 0;
         std::size_t Position = npos;

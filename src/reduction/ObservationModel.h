@@ -15,9 +15,9 @@ constexpr double kNoHeight = -10000.0;
 /// in working units.
 struct MEASSTRUCT {
     double HtTarget = 0.0;
-    double HAng = 0.0;  // reading + swing + horizontal correction, within one turn
-    double VAng = 0.0;  // zenith reading + vertical correction
-    double SDist = 0.0; // slope distance times the station's scale factor
+    double HAng = 0.0;   // reading + swing + horizontal correction, within one turn
+    double VAng = 0.0;   // zenith reading + vertical correction
+    double SDist = 0.0;  // slope distance times the station's scale factor
 };
 
 /// The measurements of one target. A forward target shares them with its side shot.
@@ -57,7 +57,7 @@ struct SSSTRUCT {
     STNSTRUCT* Stn = nullptr;
     int ForwardFlag = 0;
     int SkipMean = 0;
-    int RecordNo = 0;  // the row that last observed the target, counted from 1
+    int RecordNo = 0;                   // the row that last observed the target, counted from 1
     std::vector<std::wstring> PtNames;  // names of PT records filed before this observation
     std::vector<SSCheck> ChkShots;      // check shots filed before it
 };
@@ -66,7 +66,7 @@ struct SSSTRUCT {
 /// list that grows long gets an index by name, so a station with many shots stays linear
 /// to fill.
 class TargetList {
-public:
+  public:
     SSSTRUCT* Find(const std::wstring& name) const;
     void Append(std::unique_ptr<SSSTRUCT> target);
     /// Puts `fresh` where `old` stands and gives `old` back to the caller.
@@ -80,7 +80,7 @@ public:
     auto begin() const { return targets_.begin(); }
     auto end() const { return targets_.end(); }
 
-private:
+  private:
     static constexpr std::size_t kIndexFrom = 16;
     std::size_t PositionOf(const std::wstring& name) const;
 
@@ -122,7 +122,6 @@ struct STNSTRUCT {
     STNSTRUCT* NextSameName = nullptr;  // the engine's chain of nodes that share a name,
     STNSTRUCT* LastSameName = nullptr;  // and, on its first node, the chain's end
 };
-
 
 /// A directed line between two names with its bearing in degrees.
 struct ULINEBEAR_STRUCT {

@@ -26,7 +26,9 @@ constexpr double kNoInstrumentHeight = 0.0001;
 // the mean radius, so that the correction stays finite and close to what was meant.
 constexpr double kMeanEarthRadiusMetres = 6370000.0;
 
-double Number(const std::wstring& text) { return nedit::TextToDouble(text); }
+double Number(const std::wstring& text) {
+    return nedit::TextToDouble(text);
+}
 
 void AppendNames(std::vector<std::wstring>& to, const std::vector<std::wstring>& names) {
     to.insert(to.end(), names.begin(), names.end());
@@ -35,9 +37,10 @@ void AppendNames(std::vector<std::wstring>& to, const std::vector<std::wstring>&
 // A row as the reduction reads it: at most 255 characters, trimmed, in upper case. Rows
 // that came through the list's gate are so already and are read in place.
 const std::wstring& ReadRow(const std::wstring& row, std::wstring& buffer) {
-    const bool ready = row.size() <= static_cast<std::size_t>(kMaxRowLength) &&
-                       (row.empty() || (!nedit::IsBlank(row.front()) && !nedit::IsBlank(row.back()))) &&
-                       std::none_of(row.begin(), row.end(), [](wchar_t c) { return c >= L'a'; });
+    const bool ready =
+        row.size() <= static_cast<std::size_t>(kMaxRowLength) &&
+        (row.empty() || (!nedit::IsBlank(row.front()) && !nedit::IsBlank(row.back()))) &&
+        std::none_of(row.begin(), row.end(), [](wchar_t c) { return c >= L'a'; });
     if (ready) return row;
     buffer = nedit::ToUpper(nedit::TrimView(std::wstring_view(row).substr(0, kMaxRowLength)));
     return buffer;
@@ -166,7 +169,8 @@ int UNeditDatabase::ProcessRecord(int type, const std::wstring& row, int recordN
             std::wstring id = OwnValue(fld::ID);
             if (id.empty() && CurStn) id = CurStn->StnName;
             if (!id.empty()) {
-                KnownCoordMap[id] = {Number(GetValue(fld::E)), Number(GetValue(fld::N)), Number(GetValue(fld::H))};
+                KnownCoordMap[id] = {Number(GetValue(fld::E)), Number(GetValue(fld::N)),
+                                     Number(GetValue(fld::H))};
             }
             return 1;
         }
@@ -318,12 +322,12 @@ void UNeditDatabase::ApplyDistanceCorrection(MEASSTRUCT& measurement) const {
     constexpr double kRadToDeg = 57.29577791868205;
     constexpr double kQuarterTurn = 1.5707963705062866;
     constexpr double kHalfTurn = 3.1415927410125732;
-    const double radius = EarthRadius > 0.0
-                              ? EarthRadius
-                              : nedit::ConvertLength(kMeanEarthRadiusMetres, nedit::LengthUnit::Metres,
-                                                     Doc->GetJobSettings() != nullptr
-                                                         ? Doc->GetJobSettings()->GetLengthUnit()
-                                                         : nedit::LengthUnit::Metres);
+    const double radius =
+        EarthRadius > 0.0 ? EarthRadius
+                          : nedit::ConvertLength(kMeanEarthRadiusMetres, nedit::LengthUnit::Metres,
+                                                 Doc->GetJobSettings() != nullptr
+                                                     ? Doc->GetJobSettings()->GetLengthUnit()
+                                                     : nedit::LengthUnit::Metres);
     const double d = measurement.SDist;
     const double z = measurement.VAng * kDegToRad;
     const double a = d * std::sin(z) / (2.0 * radius);
@@ -336,7 +340,7 @@ void UNeditDatabase::ApplyDistanceCorrection(MEASSTRUCT& measurement) const {
         return;
     }
     const double t = std::fabs(h) > std::fabs(v) ? std::atan(-std::fabs(v / h)) + kQuarterTurn
-                                                   : std::atan(std::fabs(h / v));
+                                                 : std::atan(std::fabs(h / v));
     double angle;
     if (v >= 0.0) {
         angle = h >= 0.0 ? t : -t;
@@ -436,10 +440,12 @@ int UNeditDatabase::AddReverseFSptr(STNSTRUCT* station, SSSTRUCT* target) {
 
 // The occupied stations of that exact name, other than `observer`.
 std::vector<STNSTRUCT*> UNeditDatabase::OccupiedStations(const std::wstring& name,
-                                                        const STNSTRUCT* observer) const {
+                                                         const STNSTRUCT* observer) const {
     std::vector<STNSTRUCT*> found;
-    for (STNSTRUCT* station = FirstNamed(name); station != nullptr; station = station->NextSameName) {
-        if (!station->PointOnly && !station->ReverseStn && station != observer) found.push_back(station);
+    for (STNSTRUCT* station = FirstNamed(name); station != nullptr;
+         station = station->NextSameName) {
+        if (!station->PointOnly && !station->ReverseStn && station != observer)
+            found.push_back(station);
     }
     return found;
 }
@@ -452,11 +458,13 @@ int UNeditDatabase::PrepareForwardNoBS() {
     for (std::size_t s = 0; s < Stations.size(); ++s) {
         STNSTRUCT* station = Stations[s].get();
         if (AbortRequested()) return 0;
-        UpdateProgress(static_cast<unsigned>(100 * ++done / std::max<std::size_t>(steps, 1)), kGeneratingGraphics);
+        UpdateProgress(static_cast<unsigned>(100 * ++done / std::max<std::size_t>(steps, 1)),
+                       kGeneratingGraphics);
         if (station->PointOnly || station->ReverseStn) continue;
         for (std::size_t t = 0; t < station->SSList.size(); ++t) {
             SSSTRUCT* target = station->SSList.at(t);
-            UpdateProgress(static_cast<unsigned>(100 * ++done / std::max<std::size_t>(steps, 1)), kGeneratingGraphics);
+            UpdateProgress(static_cast<unsigned>(100 * ++done / std::max<std::size_t>(steps, 1)),
+                           kGeneratingGraphics);
             if (target->SkipMean) continue;
             for (STNSTRUCT* sighted : OccupiedStations(target->SSName, station)) {
                 sighted->Sighted = 1;
@@ -500,7 +508,8 @@ int UNeditDatabase::AddNewStn(const std::wstring& name) {
     station->Sighted = 1;
     AppendStation(std::move(station));
     if (ListCtrl == nullptr) return 0;
-    return ListCtrl->AddRecord(ListCtrl->GetItemCount(), nedit::Format(L"%-10s ID=%s,HI=0.000,CO= ", L"STN", name)) >= 0;
+    return ListCtrl->AddRecord(ListCtrl->GetItemCount(),
+                               nedit::Format(L"%-10s ID=%s,HI=0.000,CO= ", L"STN", name)) >= 0;
 }
 
 int UNeditDatabase::DeleteForwPtr() {
@@ -528,7 +537,8 @@ int UNeditDatabase::GetListCount(int& stations, int& sideShots, int& forward) co
 }
 
 STNSTRUCT* UNeditDatabase::searchSTN(const std::wstring& name) const {
-    for (STNSTRUCT* station = FirstNamed(name); station != nullptr; station = station->NextSameName) {
+    for (STNSTRUCT* station = FirstNamed(name); station != nullptr;
+         station = station->NextSameName) {
         if (!station->PointOnly) return station;
     }
     return nullptr;
@@ -538,7 +548,8 @@ int UNeditDatabase::SearchSTN(const std::wstring& name, std::vector<STNSTRUCT*>&
     out.clear();
     const std::wstring wanted = nedit::ToUpper(name);
     for (const auto& station : Stations) {
-        if (!station->PointOnly && nedit::ToUpper(station->StnName) == wanted) out.push_back(station.get());
+        if (!station->PointOnly && nedit::ToUpper(station->StnName) == wanted)
+            out.push_back(station.get());
     }
     return static_cast<int>(out.size());
 }

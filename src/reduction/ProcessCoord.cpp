@@ -8,14 +8,14 @@
 #include "platform/geometry/UAngle.h"
 #include "platform/geometry/UWLine.h"
 #include "platform/geometry/UWVector.h"
+#include "platform/messages/Translate.h"
+#include "platform/text/Format.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
 #include "reduction/UBKBCoordDlg.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "reduction/UNeditDatabase.h"
 #include "report/UNeditReport.h"
-#include "platform/messages/Translate.h"
-#include "platform/text/Format.h"
 
 namespace {
 
@@ -37,14 +37,15 @@ struct UNeditDatabase::StationWork {
     bool HeadPrinted = false;
 };
 
-void UNeditDatabase::geo_coord(double e, double n, double bearing, double dist, double* eOut, double* nOut) {
+void UNeditDatabase::geo_coord(double e, double n, double bearing, double dist, double* eOut,
+                               double* nOut) {
     const double b = bearing * kRadiansPerDegree;
     *eOut = std::sin(b) * dist + e;
     *nOut = std::cos(b) * dist + n;
 }
 
-void UNeditDatabase::ApplyOffsets(double& e, double& n, double& z, double along, double right, double up,
-                                  double bearing) {
+void UNeditDatabase::ApplyOffsets(double& e, double& n, double& z, double along, double right,
+                                  double up, double bearing) {
     const UWVector ahead(UWBrgDst(bearing, along));
     const UWVector aside(UWBrgDst(bearing + 90.0, right));
     e += ahead.x + aside.x;
@@ -56,12 +57,13 @@ bool UNeditDatabase::IsSelfObservation(const STNSTRUCT& station, const SSSTRUCT&
     return nedit::EqualsIgnoreCase(target.SSName, station.StnName);
 }
 
-void UNeditDatabase::ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target, const StationWork& work,
-                                  double& e, double& n, double& z) const {
+void UNeditDatabase::ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target,
+                                  const StationWork& work, double& e, double& n, double& z) const {
     const double zenith = target.VAng * kRadiansPerDegree;
     const double horizontal = std::sin(zenith) * target.SDist + PrismConst;
     const double vertical = std::cos(zenith) * target.SDist;
-    const double theta = station.HMode == L'B' ? target.HAng : work.BackBearing + target.AngleFromBS;
+    const double theta =
+        station.HMode == L'B' ? target.HAng : work.BackBearing + target.AngleFromBS;
     e = std::sin(theta * kRadiansPerDegree) * horizontal + work.StnE;
     n = std::cos(theta * kRadiansPerDegree) * horizontal + work.StnN;
     z = work.StnZ > kNoHeight ? vertical + work.StnZ + station.HtInst - target.HtTarget : work.StnZ;
@@ -71,10 +73,12 @@ void UNeditDatabase::ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target, co
     }
 }
 
-int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly, std::vector<std::wstring>* records) {
+int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
+                                 std::vector<std::wstring>* records) {
     StationWork work;
     work.Steps = 0;
-    for (const auto& station : Stations) work.Steps += 1 + station->SSList.size() + station->FSList.size();
+    for (const auto& station : Stations)
+        work.Steps += 1 + station->SSList.size() + station->FSList.size();
     if (work.Steps == 0) work.Steps = 1;
 
     const bool printing = Report != nullptr && report == 1;
@@ -89,11 +93,12 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly, std::vec
             break;
         }
         if (station.PointOnly || station.ReverseStn) continue;
-        if (station.BSList.empty() && station.SSList.empty() && station.FSList.empty() && station.Sighted == 0 &&
-            !station.HasCheck) {
+        if (station.BSList.empty() && station.SSList.empty() && station.FSList.empty() &&
+            station.Sighted == 0 && !station.HasCheck) {
             continue;
         }
-        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps), kGeneratingGraphics);
+        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps),
+                       kGeneratingGraphics);
 
         work.BackBearing = 0.0;
         work.BsReading = station.BkAngle;
@@ -116,9 +121,11 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly, std::vec
         if (position == kPositionFound) {
             double be = 0.0, bn = 0.0, bz = kNoHeight;
             std::wstring back_code;
-            if (findCoord(station.BkStnName, be, bn, bz, back_code, report, true) && Report != nullptr) {
+            if (findCoord(station.BkStnName, be, bn, bz, back_code, report, true) &&
+                Report != nullptr) {
                 double distance = 0.0;
-                UNeditReport::geo_brgdst(work.StnE, work.StnN, be, bn, &work.BackBearing, &distance);
+                UNeditReport::geo_brgdst(work.StnE, work.StnN, be, bn, &work.BackBearing,
+                                         &distance);
             }
         }
         const double stored = GetBearingFromArray(station.StnName, station.BkStnName);
@@ -128,8 +135,10 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly, std::vec
         work.HeadPrinted = false;
         if (printing && !(passes == 4 && !work.HasShots)) PrintStationBlock(station, work);
 
-        if ((passes & 2) != 0 && !station.FSList.empty() && !ForwardPass(station, work, report)) aborted = true;
-        if (!aborted && (passes & 4) != 0 && !station.SSList.empty() && !SideShotPass(station, work, report)) {
+        if ((passes & 2) != 0 && !station.FSList.empty() && !ForwardPass(station, work, report))
+            aborted = true;
+        if (!aborted && (passes & 4) != 0 && !station.SSList.empty() &&
+            !SideShotPass(station, work, report)) {
             aborted = true;
         }
     }
@@ -140,13 +149,17 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly, std::vec
 int UNeditDatabase::OrientByCoordinates(STNSTRUCT& station, StationWork& work) {
     if (!station.CoordKnown) {
         std::wstring code = station.StnCode;
-        if (findCoord(station.StnName, station.East, station.North, station.Height, code, 0, true) ||
-            GetPointFromPtList(station.StnName, station.East, station.North, station.Height, code, 1)) {
+        if (findCoord(station.StnName, station.East, station.North, station.Height, code, 0,
+                      true) ||
+            GetPointFromPtList(station.StnName, station.East, station.North, station.Height, code,
+                               1)) {
             station.StnCode = code;
         } else if (FindXYZ(station.StnName, station.East, station.North, station.Height) >= 0) {
             station.CoordKnown = 1;
         } else {
-            UCoordEntryDlg dialog(CoordsOrderXY() ? UCoordEntryDlg::kEastFirstId : UCoordEntryDlg::kNorthFirstId, Host);
+            UCoordEntryDlg dialog(
+                CoordsOrderXY() ? UCoordEntryDlg::kEastFirstId : UCoordEntryDlg::kNorthFirstId,
+                Host);
             if (dialog.process(station.StnName, UseForAll) != 1) return 0;
             station.East = dialog.getEast();
             station.North = dialog.getNorth();
@@ -177,7 +190,8 @@ int UNeditDatabase::OrientByCoordinates(STNSTRUCT& station, StationWork& work) {
     return 1;
 }
 
-void UNeditDatabase::AskBackStation(const STNSTRUCT& station, StationWork& work, const UWPoint& here) {
+void UNeditDatabase::AskBackStation(const STNSTRUCT& station, StationWork& work,
+                                    const UWPoint& here) {
     UBKBCoordDlg dialog(station.BkStnName);
     // The dialog has OK only: whatever stands in its fields is taken.
     if (Host != nullptr) Host->RunDialog(dialog);
@@ -185,13 +199,15 @@ void UNeditDatabase::AskBackStation(const STNSTRUCT& station, StationWork& work,
         work.BackBearing = dialog.Bearing;
         const int row = FindRecord(rec::Bkb, station.BkStnName);
         if (row >= 0) {
-            ReplaceRow(row, FormatBKBRecord(station.BkStnName, station.BkAngle - FirstSwing - CurSwing - HCorr,
+            ReplaceRow(row, FormatBKBRecord(station.BkStnName,
+                                            station.BkAngle - FirstSwing - CurSwing - HCorr,
                                             dialog.Bearing));
         }
         return;
     }
     work.BackBearing = UWLine(here, UWPoint(dialog.East, dialog.North, dialog.Height)).Bearing();
-    const std::wstring text = FormatXYZRecord(station.BkStnName, dialog.East, dialog.North, dialog.Height);
+    const std::wstring text =
+        FormatXYZRecord(station.BkStnName, dialog.East, dialog.North, dialog.Height);
     double e = 0.0, n = 0.0, z = 0.0;
     const int row = FindXYZ(station.BkStnName, e, n, z);
     if (row < 0) {
@@ -202,7 +218,8 @@ void UNeditDatabase::AskBackStation(const STNSTRUCT& station, StationWork& work,
     }
 }
 
-int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int report, int fixedOnly) {
+int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int report,
+                                    int fixedOnly) {
     work.StnE = work.StnN = 0.0;
     work.StnZ = kNoHeight;
     work.StnCodeOut.clear();
@@ -273,10 +290,12 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
             work.HeadPrinted = true;
         }
         if (AbortRequested()) return 0;
-        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps), kGeneratingGraphics);
+        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps),
+                       kGeneratingGraphics);
         if (GetTravPointIdx(target.SSName) >= 0) {
             const int to = GetPointIdx(target.SSName);
-            if (from >= 0 && to >= 0 && from != to) SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 1);
+            if (from >= 0 && to >= 0 && from != to)
+                SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 1);
             continue;
         }
         if (!target.AngleValid) continue;
@@ -284,9 +303,11 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
         ReduceTarget(station, target, work, e, n, z);
         if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, true);
         if (IsSelfObservation(station, target)) continue;
-        if (searchSTN(target.SSName) != nullptr) setCoord(target.SSName, e, n, z, target.SSCode, 8, report, 0);
+        if (searchSTN(target.SSName) != nullptr)
+            setCoord(target.SSName, e, n, z, target.SSCode, 8, report, 0);
         const int to = GetPointIdx(target.SSName);
-        if (from >= 0 && to >= 0 && from != to) SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 0);
+        if (from >= 0 && to >= 0 && from != to)
+            SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 0);
     }
     return 1;
 }
@@ -295,7 +316,8 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
     for (std::size_t t = 0; t < station.SSList.size(); ++t) {
         SSSTRUCT& target = *station.SSList.at(t);
         if (AbortRequested()) return 0;
-        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps), kGeneratingGraphics);
+        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps),
+                       kGeneratingGraphics);
         if (!work.HeadPrinted && Report != nullptr && report == 1) {
             if (work.HasShots) Report->PrintSSHead();
             work.HeadPrinted = true;
@@ -320,50 +342,61 @@ void UNeditDatabase::PrintRunHead() {
         Report->PrintHeadVDegree(L"VCORR", 0.0);
         Report->PrintEdmHead();
         Report->PrintHeadDVal(L"PRISM", PrismConst);
-        Report->WriteText(Format(L"%-29s : %-15.8f", Translate(L"Scale Factor"), ScaleFactor), 0, 1, 0);
+        Report->WriteText(Format(L"%-29s : %-15.8f", Translate(L"Scale Factor"), ScaleFactor), 0, 1,
+                          0);
         Report->SetHeaderOutputed(true);
     }
-    if (!Is_Zero(FirstSwing, false)) Report->PrintHeadHDegree(Translate(L"Swing"), FirstSwing, true);
+    if (!Is_Zero(FirstSwing, false))
+        Report->PrintHeadHDegree(Translate(L"Swing"), FirstSwing, true);
     if (!DateText.empty()) {
-        Report->WriteText(Format(L"%s                          : %-s", Translate(L"Date"), DateText), 0, 1, 0);
+        Report->WriteText(
+            Format(L"%s                          : %-s", Translate(L"Date"), DateText), 0, 1, 0);
     }
 }
 
 void UNeditDatabase::PrintStationBlock(const STNSTRUCT& station, const StationWork& work) {
     const bool bearing_mode = station.HMode == L'B';
-    Report->PrintOccStnBlk(&station, station.StnName, work.StnE, work.StnN, work.StnZ, station.StnCode,
-                           station.HtInst, GetStnScaleFactor(station.StnName),
-                           bearing_mode ? std::wstring() : station.BkStnName, bearing_mode ? 0.0 : work.BackBearing,
-                           bearing_mode ? 0.0 : work.BsReading);
-    if (!Is_Zero(station.Swing - FirstSwing, false)) Report->PrintHeadHDegree(L"Swing", station.Swing, true);
+    Report->PrintOccStnBlk(
+        &station, station.StnName, work.StnE, work.StnN, work.StnZ, station.StnCode, station.HtInst,
+        GetStnScaleFactor(station.StnName), bearing_mode ? std::wstring() : station.BkStnName,
+        bearing_mode ? 0.0 : work.BackBearing, bearing_mode ? 0.0 : work.BsReading);
+    if (!Is_Zero(station.Swing - FirstSwing, false))
+        Report->PrintHeadHDegree(L"Swing", station.Swing, true);
 }
 
-void UNeditDatabase::PrintTarget(const STNSTRUCT& station, const SSSTRUCT& target, double e, double n, double z,
-                                 bool forward) {
+void UNeditDatabase::PrintTarget(const STNSTRUCT& station, const SSSTRUCT& target, double e,
+                                 double n, double z, bool forward) {
     using nedit::Format;
     using nedit::Translate;
     const bool self = IsSelfObservation(station, target);
     if (self) {
-        Report->WriteText(forward ? Translate(L"   *** Observation to the station itself not processed  ***")
-                                  : Format(L"   *** %s  ***", Translate(L"Observation to the station itself not processed")),
-                          0, 1, 0);
+        Report->WriteText(
+            forward ? Translate(L"   *** Observation to the station itself not processed  ***")
+                    : Format(L"   *** %s  ***",
+                             Translate(L"Observation to the station itself not processed")),
+            0, 1, 0);
     }
     const MeasurementList& measurements = *target.Meas;
     if (measurements.size() >= 2) {
         for (const MEASSTRUCT& m : measurements) {
-            Report->PrintSSLine(target.SSName, m.HAng, m.VAng, m.SDist, m.HtTarget, 0.0, 0.0, 0.0, L"", 0, false);
+            Report->PrintSSLine(target.SSName, m.HAng, m.VAng, m.SDist, m.HtTarget, 0.0, 0.0, 0.0,
+                                L"", 0, false);
         }
     }
-    Report->PrintSSLine((measurements.size() >= 2 ? L"*" : L"") + target.SSName, target.HAng, target.VAng,
-                        target.SDist, target.HtTarget, e, n, z, target.SSCode, target.RecordNo, true);
+    Report->PrintSSLine((measurements.size() >= 2 ? L"*" : L"") + target.SSName, target.HAng,
+                        target.VAng, target.SDist, target.HtTarget, e, n, z, target.SSCode,
+                        target.RecordNo, true);
     if (!Is_Zero(target.OffsetAlong, false) || !Is_Zero(target.OffsetRight, false) ||
         !Is_Zero(target.OffsetUp, false)) {
         Report->PrintOffset(target.OffsetAlong, target.OffsetRight, target.OffsetUp);
     }
-    if (self) Report->WriteText(L"   ****************************************************************", 0, 1, 0);
+    if (self)
+        Report->WriteText(L"   ****************************************************************", 0,
+                          1, 0);
 }
 
-bool UNeditDatabase::HaveSideshotsToReport(const STNSTRUCT* station, const std::vector<std::wstring>* /*records*/) const {
+bool UNeditDatabase::HaveSideshotsToReport(const STNSTRUCT* station,
+                                           const std::vector<std::wstring>* /*records*/) const {
     if (station == nullptr) return false;
     for (const auto& target : station->SSList) {
         if (!target->PtNames.empty() || !target->ChkShots.empty()) return true;

@@ -7,7 +7,7 @@
 #include "platform/messages/DialogHost.h"
 
 class UBKBCoordDlg : public nedit::UDialogLogic {
-public:
+  public:
     static constexpr int kDialogId = 8035;
 
     explicit UBKBCoordDlg(const std::wstring& pointName) : PointName(pointName) {}
@@ -25,6 +25,6 @@ public:
     double Bearing = 0.0;
     bool ApplyBearing = false;
 
-private:
+  private:
     std::wstring PointName;
 };

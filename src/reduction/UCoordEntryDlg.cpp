@@ -1,6 +1,7 @@
 #include "reduction/UCoordEntryDlg.h"
 
-UCoordEntryDlg::UCoordEntryDlg(int dialogId, nedit::DialogHost* host) : DialogId(dialogId), Host(host) {
+UCoordEntryDlg::UCoordEntryDlg(int dialogId, nedit::DialogHost* host)
+    : DialogId(dialogId), Host(host) {
     Entered.Offered = true;
 }
 
@@ -19,9 +20,12 @@ void UCoordEntryDlg::InitXYZSvy(double e, double n, double z, const std::wstring
 const UCoordEntryDlg::Row& UCoordEntryDlg::RowOf(Source source) const {
     static const Row kBlank;
     switch (source) {
-        case Source::Database: return Database.Offered ? Database : kBlank;
-        case Source::Field: return Field.Offered ? Field : kBlank;
-        default: return Entered;
+        case Source::Database:
+            return Database.Offered ? Database : kBlank;
+        case Source::Field:
+            return Field.Offered ? Field : kBlank;
+        default:
+            return Entered;
     }
 }
 
@@ -31,7 +35,9 @@ UCoordEntryDlg::Source UCoordEntryDlg::BestOffered() const {
     return Source::Enter;
 }
 
-void UCoordEntryDlg::OnInitDialog() { Selected = BestOffered(); }
+void UCoordEntryDlg::OnInitDialog() {
+    Selected = BestOffered();
+}
 
 void UCoordEntryDlg::SelectSource(Source source) {
     if (IsOffered(source)) Selected = source;

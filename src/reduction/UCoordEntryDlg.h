@@ -7,7 +7,7 @@
 #include "platform/messages/DialogHost.h"
 
 class UCoordEntryDlg : public nedit::UDialogLogic {
-public:
+  public:
     /// Dialog forms: Easting before Northing, or Northing first.
     static constexpr int kEastFirstId = 8115;
     static constexpr int kNorthFirstId = 8112;
@@ -66,7 +66,7 @@ public:
     /// The source of the values given back.
     Source GetChosenSource() const { return Chosen; }
 
-private:
+  private:
     Source BestOffered() const;
     void TakeSource(Source source);
 

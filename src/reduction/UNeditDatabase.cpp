@@ -17,8 +17,14 @@ namespace {
 // Rows of these types are no content: changing them does not call for a new reduction.
 bool IsContentType(int type) {
     switch (type) {
-        case rec::Comment: case rec::Note: case rec::Job: case rec::Date:
-        case rec::Name: case rec::Drec: case rec::Instru: case rec::Edm:
+        case rec::Comment:
+        case rec::Note:
+        case rec::Job:
+        case rec::Date:
+        case rec::Name:
+        case rec::Drec:
+        case rec::Instru:
+        case rec::Edm:
             return false;
         default:
             return true;
@@ -30,7 +36,11 @@ bool IsContentType(int type) {
 UNeditDatabase::UNeditDatabase(UNeutralFileFormat* format, UListCtrl* list, USurveyDoc* job,
                                nedit::DialogHost* host, nedit::ProgressSink* progress,
                                const std::wstring& chkCode)
-    : Doc(format), ListCtrl(list), SurveyDoc(job), Host(host), Progress(progress),
+    : Doc(format),
+      ListCtrl(list),
+      SurveyDoc(job),
+      Host(host),
+      Progress(progress),
       ChkCode(chkCode.empty() ? L"*CHK" : chkCode) {
     // Older field programs left a debugging file behind; an engine clears it away.
     std::remove("DEBUG.DAT");
@@ -45,7 +55,9 @@ UNeditDatabase::~UNeditDatabase() {
     DeleteBearingArray();
 }
 
-bool UNeditDatabase::AbortRequested() const { return Progress != nullptr && Progress->AbortRequested(); }
+bool UNeditDatabase::AbortRequested() const {
+    return Progress != nullptr && Progress->AbortRequested();
+}
 
 void UNeditDatabase::UpdateProgress(unsigned percent, std::wstring_view text) {
     // Only changes go out, so that a run of millions of records does not flood the sink.
@@ -57,9 +69,14 @@ void UNeditDatabase::UpdateProgress(unsigned percent, std::wstring_view text) {
 
 int UNeditDatabase::GetAngleType() const {
     switch (AngleUnit) {
-        case L'D': case L'd': return 1;
-        case L'G': case L'g': return 2;
-        default: return 0;
+        case L'D':
+        case L'd':
+            return 1;
+        case L'G':
+        case L'g':
+            return 2;
+        default:
+            return 0;
     }
 }
 
@@ -85,7 +102,8 @@ void UNeditDatabase::SetMaxMin(const UWRect& extents) {
 
 int UNeditDatabase::Process() {
     if (Doc != nullptr && !Doc->IsKeysInitialised()) {
-        nedit::AppMessageBox(Host, nedit::Translate(L"Record keys or fields have not been initialised."),
+        nedit::AppMessageBox(Host,
+                             nedit::Translate(L"Record keys or fields have not been initialised."),
                              nedit::mb::IconStop);
         return 0;
     }
@@ -138,13 +156,16 @@ std::vector<std::wstring> UNeditDatabase::ContentRows() const {
     if (ListCtrl == nullptr || Doc == nullptr) return rows;
     rows.reserve(static_cast<std::size_t>(ListCtrl->GetItemCount()));
     for (int row = 0; row < ListCtrl->GetItemCount(); ++row) {
-        std::wstring text = nedit::ToUpper(nedit::TrimView(std::wstring_view(ListCtrl->GetItemText(row)).substr(0, kMaxRowLength)));
+        std::wstring text = nedit::ToUpper(nedit::TrimView(
+            std::wstring_view(ListCtrl->GetItemText(row)).substr(0, kMaxRowLength)));
         if (IsContentType(Doc->GetRecordType(text))) rows.push_back(std::move(text));
     }
     return rows;
 }
 
-void UNeditDatabase::CreateContent() { ContentLines = ContentRows(); }
+void UNeditDatabase::CreateContent() {
+    ContentLines = ContentRows();
+}
 
 bool UNeditDatabase::IsContentModified() const {
     if (ListCtrl == nullptr || Doc == nullptr) return false;
@@ -162,7 +183,9 @@ bool UNeditDatabase::IsContentModified() const {
         // A field only the present row has does not count; a changed case does not either.
         for (const auto& [id, value] : stored_fields) {
             const auto found = present_fields.find(id);
-            if (found == present_fields.end() || nedit::ToUpper(found->second) != nedit::ToUpper(value)) return true;
+            if (found == present_fields.end() ||
+                nedit::ToUpper(found->second) != nedit::ToUpper(value))
+                return true;
         }
     }
     return false;

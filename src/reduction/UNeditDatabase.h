@@ -43,7 +43,7 @@ struct KnownCoord {
 extern double CurInstHt;
 
 class UNeditDatabase {
-public:
+  public:
     /// The engine of a document: its format service, record list, job and dialog host, each
     /// of which may be null. `chkCode` is the check code, "*CHK" when empty.
     UNeditDatabase(UNeutralFileFormat* format, UListCtrl* list, USurveyDoc* job,
@@ -89,7 +89,9 @@ public:
     /// The angle type of the current angular unit letter: 1 decimal degrees, 2 gons, else 0.
     int GetAngleType() const;
     /// The pane, when there is one, learns the angle type of each unit record read.
-    void SetAngleTypeHandler(std::function<void(int)> handler) { AngleTypeHandler = std::move(handler); }
+    void SetAngleTypeHandler(std::function<void(int)> handler) {
+        AngleTypeHandler = std::move(handler);
+    }
 
     // ---- List preparation -------------------------------------------------------------
     int PrepareList();
@@ -99,7 +101,8 @@ public:
     /// Valid until the next record is parsed.
     const std::wstring& GetValue(int id) const;
     int InsertStn(std::unique_ptr<STNSTRUCT> station, int makeCurrent);
-    int InsertSSMS(std::unique_ptr<SSSTRUCT> target, const MEASSTRUCT& measurement, int isBackSight);
+    int InsertSSMS(std::unique_ptr<SSSTRUCT> target, const MEASSTRUCT& measurement,
+                   int isBackSight);
     int CopySS(const SSSTRUCT& from, SSSTRUCT& to) const;
     int DummyStn(const STNSTRUCT& station) const;
     int AddToFSptr(STNSTRUCT* station, SSSTRUCT* target);
@@ -149,15 +152,17 @@ public:
                  int clear, bool showDialog);
     int setCoord(const std::wstring& name, double e, double n, double z, const std::wstring& code,
                  int flags, int fix, int ptFlag);
-    int GetCoordFromStnList(const std::wstring& name, double& e, double& n, double& z, std::wstring& code) const;
+    int GetCoordFromStnList(const std::wstring& name, double& e, double& n, double& z,
+                            std::wstring& code) const;
     /// 1 when the job has the point and it loads, with its values and code.
-    int GetCoordFromSvyDoc(const std::wstring& name, double& e, double& n, double& z, std::wstring& code) const;
+    int GetCoordFromSvyDoc(const std::wstring& name, double& e, double& n, double& z,
+                           std::wstring& code) const;
     /// The job has a point of that name (whether or not it loads).
     bool JobHasPoint(const std::wstring& name) const;
     /// Coordinates are shown Easting first: the job's setting, and so without a job.
     bool CoordsOrderXY() const;
-    int GetPointFromPtList(const std::wstring& name, double& e, double& n, double& z, std::wstring& code,
-                           unsigned mode) const;
+    int GetPointFromPtList(const std::wstring& name, double& e, double& n, double& z,
+                           std::wstring& code, unsigned mode) const;
     int FindXYZ(const std::wstring& name, double& e, double& n, double& z);
     int FindRecord(int type, const std::wstring& name);
     std::wstring FormatXYZRecord(const std::wstring& name, double e, double n, double z) const;
@@ -175,8 +180,10 @@ public:
     // ---- Reduction --------------------------------------------------------------------
     int ProcessCoord(int passes, int report, int fixedOnly, std::vector<std::wstring>* records);
     /// A station has side shots, points or check shots whose lines the report prints.
-    bool HaveSideshotsToReport(const STNSTRUCT* station, const std::vector<std::wstring>* records) const;
-    static void geo_coord(double e, double n, double bearing, double dist, double* eOut, double* nOut);
+    bool HaveSideshotsToReport(const STNSTRUCT* station,
+                               const std::vector<std::wstring>* records) const;
+    static void geo_coord(double e, double n, double bearing, double dist, double* eOut,
+                          double* nOut);
     static void ApplyOffsets(double& e, double& n, double& z, double along, double right, double up,
                              double bearing);
 
@@ -198,7 +205,8 @@ public:
     bool GetPtNameAt(int index, std::wstring& name) const;
     int GetLineIdx(const std::wstring& a, const std::wstring& b) const;
     int Check_In_LnList(const std::wstring& name) const;
-    int SearchArc(const std::wstring& a, const std::wstring& b, const std::wstring& third, ArcType type) const;
+    int SearchArc(const std::wstring& a, const std::wstring& b, const std::wstring& third,
+                  ArcType type) const;
 
     // ---- Derived points back into the rows --------------------------------------------
     /// Writes the adjusted points as XYZ rows behind the marker row, making the marker when
@@ -220,7 +228,7 @@ public:
     /// The messages of the coordinate dialogs go to this host; null answers by default.
     nedit::DialogHost* GetDialogHost() const { return Host; }
 
-private:
+  private:
     bool AbortRequested() const;
     void ResetForRerun();
     void AppendStation(std::unique_ptr<STNSTRUCT> station);
@@ -234,11 +242,13 @@ private:
     void ProcessBkbRecord();
     void ProcessObservation(int type, int recordNo);
     void ApplyDistanceCorrection(MEASSTRUCT& measurement) const;
-    int FindCoordinateRow(const std::wstring& name, bool coordinates, int type, double* e, double* n, double* z);
+    int FindCoordinateRow(const std::wstring& name, bool coordinates, int type, double* e,
+                          double* n, double* z);
     void ReplaceRow(int row, const std::wstring& text);
     /// The first node of that exact name, in list order; the others follow by NextSameName.
     STNSTRUCT* FirstNamed(const std::wstring& name) const;
-    std::vector<STNSTRUCT*> OccupiedStations(const std::wstring& name, const STNSTRUCT* observer) const;
+    std::vector<STNSTRUCT*> OccupiedStations(const std::wstring& name,
+                                             const STNSTRUCT* observer) const;
     void RebuildPointIndex();
     void RebuildLineIndex();
     std::vector<std::wstring> ContentRows() const;
@@ -257,7 +267,8 @@ private:
     // The report's part of the walk; called only with a report and reporting on.
     void PrintRunHead();
     void PrintStationBlock(const STNSTRUCT& station, const StationWork& work);
-    void PrintTarget(const STNSTRUCT& station, const SSSTRUCT& target, double e, double n, double z, bool forward);
+    void PrintTarget(const STNSTRUCT& station, const SSSTRUCT& target, double e, double n, double z,
+                     bool forward);
 
     // Collaborators.
     UNeutralFileFormat* Doc;
@@ -297,9 +308,10 @@ private:
     std::vector<std::unique_ptr<STNSTRUCT>> Stations;
     // The first node of each name, by its place in Stations; the others of that name follow
     // by NextSameName.
-    NameIndex StationsByName{[this](std::size_t i) -> const std::wstring& { return Stations[i]->StnName; }};
-    STNSTRUCT* CurStn = nullptr;          // the station being filled, or the last one of a pass
-    std::unique_ptr<STNSTRUCT> PendingStn; // owns the station being filled until it joins the list
+    NameIndex StationsByName{
+        [this](std::size_t i) -> const std::wstring& { return Stations[i]->StnName; }};
+    STNSTRUCT* CurStn = nullptr;            // the station being filled, or the last one of a pass
+    std::unique_ptr<STNSTRUCT> PendingStn;  // owns the station being filled until it joins the list
     SSSTRUCT* CurSS = nullptr;
     std::unique_ptr<std::vector<std::wstring>> CurPtNames;
     std::unique_ptr<std::vector<SSCheck>> CurChkList;
@@ -315,11 +327,14 @@ private:
 
     // Stores of reduced geometry, with look-ups by name.
     std::vector<UNeditPt> PointList;
-    NameIndex PointIndex{[this](std::size_t i) -> const std::wstring& { return PointList[i].GetID(); }};
+    NameIndex PointIndex{
+        [this](std::size_t i) -> const std::wstring& { return PointList[i].GetID(); }};
     std::vector<UNeditPt> AddPtList;
-    NameIndex AddPtIndex{[this](std::size_t i) -> const std::wstring& { return AddPtList[i].GetID(); }};
+    NameIndex AddPtIndex{
+        [this](std::size_t i) -> const std::wstring& { return AddPtList[i].GetID(); }};
     std::vector<UNeditPt> TravPtList;
-    NameIndex TravPtIndex{[this](std::size_t i) -> const std::wstring& { return TravPtList[i].GetID(); }};
+    NameIndex TravPtIndex{
+        [this](std::size_t i) -> const std::wstring& { return TravPtList[i].GetID(); }};
     std::vector<UNeditLine> LineList;
     std::unordered_map<std::wstring, std::size_t> LineIndex;
     std::vector<UNeditArc> ArcList;

@@ -17,7 +17,9 @@ int g_saved_mode = -1;
 
 }  // namespace
 
-IniFile NeditIni() { return IniFile(ConfigFile(kFileName)); }
+IniFile NeditIni() {
+    return IniFile(ConfigFile(kFileName));
+}
 
 bool InstallDefaultNeditIni(const std::string& dataDir) {
     namespace fs = std::filesystem;
@@ -28,12 +30,17 @@ bool InstallDefaultNeditIni(const std::string& dataDir) {
     return fs::copy_file(fs::path(dataDir) / kFileName, target, error);
 }
 
-std::wstring ReadOrderKey() { return NeditIni().ReadString(L"OUTPUT", L"ORDER"); }
+std::wstring ReadOrderKey() {
+    return NeditIni().ReadString(L"OUTPUT", L"ORDER");
+}
 
-void WriteOrderKey(const std::wstring& order) { NeditIni().WriteString(L"OUTPUT", L"ORDER", order); }
+void WriteOrderKey(const std::wstring& order) {
+    NeditIni().WriteString(L"OUTPUT", L"ORDER", order);
+}
 
 void WriteFramePos(int left, int top, int right, int bottom) {
-    NeditIni().WriteString(L"VIEWPOS", L"FRAMEPOS", Format(L"%d,%d,%d,%d,", left, top, right, bottom));
+    NeditIni().WriteString(L"VIEWPOS", L"FRAMEPOS",
+                           Format(L"%d,%d,%d,%d,", left, top, right, bottom));
 }
 
 NeditIniGuard::NeditIniGuard() {

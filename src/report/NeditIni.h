@@ -25,7 +25,7 @@ void WriteFramePos(int left, int top, int right, int bottom);
 /// permissions and makes it writable by its owner, the destructor puts the remembered
 /// permissions back. The remembered value is shared, so the last document opened wins.
 class NeditIniGuard {
-public:
+  public:
     NeditIniGuard();
     ~NeditIniGuard();
     NeditIniGuard(const NeditIniGuard&) = delete;

@@ -25,7 +25,8 @@ constexpr const wchar_t* kLabel = L"%-29s : %s";
 
 // ---- Head lines ------------------------------------------------------------------------
 
-void UNeditReport::PrintHeadCtrlString(const std::wstring& key, const std::wstring& section, wchar_t letter) {
+void UNeditReport::PrintHeadCtrlString(const std::wstring& key, const std::wstring& section,
+                                       wchar_t letter) {
     W(Format(kLabel, GetTitleText(key), Unit_Text(section, letter)), 0, 1);
 }
 
@@ -91,9 +92,10 @@ void UNeditReport::PrintMainReportHead() {
 
 // ---- Stations and their observations ------------------------------------------------------
 
-void UNeditReport::PrintOccStnBlk(const STNSTRUCT* station, const std::wstring& name, double e, double n, double h,
-                                  const std::wstring& code, double insHt, double scale, const std::wstring& backStn,
-                                  double backBearing, double backAngle) {
+void UNeditReport::PrintOccStnBlk(const STNSTRUCT* station, const std::wstring& name, double e,
+                                  double n, double h, const std::wstring& code, double insHt,
+                                  double scale, const std::wstring& backStn, double backBearing,
+                                  double backAngle) {
     KeepLines(10);
     NewLines(3);
     PrintHeadString(L"OCCSTN", name);
@@ -124,24 +126,27 @@ void UNeditReport::PrintSSHead() {
     const Head east{opt::EC, L"COLEC", L"%14s"};
     const Head north{opt::NC, L"COLNC", L"%14s"};
     const Head heads[] = {
-        {opt::ID, L"COLID", L"%s"},  {opt::LN, L"COLLN", L" %s"}, {opt::HA, L"COLHA", L"%13s"},
-        {opt::VA, L"COLVA", L"%13s"}, {opt::SD, L"COLSD", L"%8s"}, {opt::HD, L"COLHD", L"%8s"},
-        {opt::VD, L"COLVD", L"%8s"}, {opt::HT, L"COLHT", L"%7s"}, XYFlag ? east : north,
-        XYFlag ? north : east,       {opt::HC, L"COLHC", L"%10s"}, {opt::CO, L"COLCO", L" %s"},
+        {opt::ID, L"COLID", L"%s"},   {opt::LN, L"COLLN", L" %s"},  {opt::HA, L"COLHA", L"%13s"},
+        {opt::VA, L"COLVA", L"%13s"}, {opt::SD, L"COLSD", L"%8s"},  {opt::HD, L"COLHD", L"%8s"},
+        {opt::VD, L"COLVD", L"%8s"},  {opt::HT, L"COLHT", L"%7s"},  XYFlag ? east : north,
+        XYFlag ? north : east,        {opt::HC, L"COLHC", L"%10s"}, {opt::CO, L"COLCO", L" %s"},
     };
     // Without a document the reduced set of columns stands.
-    const int reduced[] = {opt::ID, opt::HA, opt::VA, opt::SD, opt::HT, opt::EC, opt::NC, opt::HC, opt::CO};
+    const int reduced[] = {opt::ID, opt::HA, opt::VA, opt::SD, opt::HT,
+                           opt::EC, opt::NC, opt::HC, opt::CO};
     for (const Head& head : heads) {
         const bool shown = Doc != nullptr ? IsOn(head.option)
-                                          : std::find(std::begin(reduced), std::end(reduced), head.option) !=
-                                                std::end(reduced);
-        if (shown) W(Format(head.format, GetTitleText(head.key)), head.option == opt::ID ? 1 : 0, 0);
+                                          : std::find(std::begin(reduced), std::end(reduced),
+                                                      head.option) != std::end(reduced);
+        if (shown)
+            W(Format(head.format, GetTitleText(head.key)), head.option == opt::ID ? 1 : 0, 0);
     }
     NewLines(2);
 }
 
-void UNeditReport::PrintSSLine(const std::wstring& id, double ha, double va, double sd, double ht, double e,
-                               double n, double h, const std::wstring& code, int lineNo, bool full) {
+void UNeditReport::PrintSSLine(const std::wstring& id, double ha, double va, double sd, double ht,
+                               double e, double n, double h, const std::wstring& code, int lineNo,
+                               bool full) {
     const std::wstring horizontal = Dist(std::fabs(std::sin(va * kRadiansPerDegree) * sd));
     const std::wstring vertical = Dist(std::cos(va * kRadiansPerDegree) * sd);
     const std::wstring vertical_angle = dmsString(ConvertToDisplayVA(va));
@@ -168,7 +173,8 @@ void UNeditReport::PrintSSLine(const std::wstring& id, double ha, double va, dou
 }
 
 int UNeditReport::PrintOffset(double r, double t, double v) {
-    W(Format(L"%s%43s R%10s   T%10s V%8s", Translate(L"OFFSETS"), L" ", Dist(r), Dist(t), Dist(v)), 0, 1);
+    W(Format(L"%s%43s R%10s   T%10s V%8s", Translate(L"OFFSETS"), L" ", Dist(r), Dist(t), Dist(v)),
+      0, 1);
     return 1;
 }
 
@@ -183,7 +189,8 @@ void UNeditReport::PrintPTHeader() {
     NewLines(2);
 }
 
-void UNeditReport::PrintPTRecord(const std::wstring& name, double e, double n, double h, const std::wstring& code) {
+void UNeditReport::PrintPTRecord(const std::wstring& name, double e, double n, double h,
+                                 const std::wstring& code) {
     const auto [first, second] = InOrder(Dist(e), Dist(n));
     W(Format(L"%7s", name), 0, 0);
     W(Format(L"%14s", first), 0, 0);
@@ -200,8 +207,9 @@ int UNeditReport::PrintTravHead(const std::wstring& title, bool elevAdj) {
     KeepLines(4);
     W(title.empty() ? Translate(L"Traverse") : title, 3, 2);
     const auto [first, second] = InOrder(Translate(L"Easting"), Translate(L"Northing"));
-    std::wstring line = Format(L"%7s%15s%15s%11s%17s%15s%15s", Translate(L"Point"), Translate(L"Hor Ang"),
-                               Translate(L"Azimuth"), Translate(L"Hz Dist"), first, second, Translate(L"Elevation"));
+    std::wstring line = Format(L"%7s%15s%15s%11s%17s%15s%15s", Translate(L"Point"),
+                               Translate(L"Hor Ang"), Translate(L"Azimuth"), Translate(L"Hz Dist"),
+                               first, second, Translate(L"Elevation"));
     if (elevAdj) line += Format(L" %15s", Translate(L"Elev Adjustment"));
     W(line, 0, 2);
     return 1;
@@ -223,8 +231,8 @@ int UNeditReport::PrintCoord(const std::wstring& name, double e, double n) {
     return 1;
 }
 
-int UNeditReport::PrintLine(const std::wstring& name, double ha, double brg, double dist, double e, double n,
-                            double h, bool elevAdj, double adj) {
+int UNeditReport::PrintLine(const std::wstring& name, double ha, double brg, double dist, double e,
+                            double n, double h, bool elevAdj, double adj) {
     const auto [first, second] = InOrder(Dist(e), Dist(n));
     std::wstring height = GetTitleText(L"MSGHC");
     std::wstring adjustment;
@@ -232,14 +240,15 @@ int UNeditReport::PrintLine(const std::wstring& name, double ha, double brg, dou
         height = Dist(Is_Zero(h, false) ? 0.0 : h);
         adjustment = Format(L"%15s", Dist(Is_Zero(adj, false) ? 0.0 : adj));
     }
-    std::wstring line = Format(L"%-6s %15s%15s %10s  %15s%15s%15s", name, FormatAngle(ha), FormatAngle(brg),
-                               Dist(dist), first, second, height);
+    std::wstring line = Format(L"%-6s %15s%15s %10s  %15s%15s%15s", name, FormatAngle(ha),
+                               FormatAngle(brg), Dist(dist), first, second, height);
     if (elevAdj) line += adjustment;
     W(line, 0, 1);
     return 1;
 }
 
-int UNeditReport::PrintLine(const std::wstring& name, double ha, double brg, double dist, double e, double n) {
+int UNeditReport::PrintLine(const std::wstring& name, double ha, double brg, double dist, double e,
+                            double n) {
     const auto [first, second] = InOrder(Dist(e), Dist(n));
     W(Format(L"%-6s %15s%15s %10s  %15s%15s", name, dmsString(ConvertToAngleDisplayUnit(ha)),
              dmsString(ConvertToAngleDisplayUnit(brg)), Dist(dist), first, second),
@@ -247,18 +256,22 @@ int UNeditReport::PrintLine(const std::wstring& name, double ha, double brg, dou
     return 1;
 }
 
-int UNeditReport::PrintTraverseInfo(double dE, double dN, double dH, double brg, double dist, double area,
-                                    double length, int setups, const std::wstring& accuracy, bool elevError,
-                                    bool angle, double angErr, double perStn, double known, double observed) {
+int UNeditReport::PrintTraverseInfo(double dE, double dN, double dH, double brg, double dist,
+                                    double area, double length, int setups,
+                                    const std::wstring& accuracy, bool elevError, bool angle,
+                                    double angErr, double perStn, double known, double observed) {
     // Lengths here follow the job's settings, not the report's output unit.
     const UJobSettings job = Doc != nullptr ? Doc->GetSettings() : UJobSettings();
     KeepLines(7);
     const std::wstring east = job.LengthToString(dE, false, false, 3, -1, true, false);
     const std::wstring north = job.LengthToString(dN, false, false, 3, -1, true, false);
     // Heights and areas are in the job's unit already, as the job shows them.
-    const std::wstring height = job.UnitLengthToString(Is_Zero(dH, false) ? 0.0 : dH, false, false, 3, -1, false);
-    W(Translate(XYFlag ? L"                               East Diff            North Diff           Elev Diff"
-                       : L"                               North Diff           East Diff            Elev Diff"),
+    const std::wstring height =
+        job.UnitLengthToString(Is_Zero(dH, false) ? 0.0 : dH, false, false, 3, -1, false);
+    W(Translate(XYFlag ? L"                               East Diff            North Diff          "
+                         L" Elev Diff"
+                       : L"                               North Diff           East Diff           "
+                         L" Elev Diff"),
       2, 1);
     const auto [first, second] = InOrder(east, north);
     W(Format(L"Coordinate Misclose            %-20s %-20s %-20s", first, second, height), 0, 2);
@@ -267,8 +280,9 @@ int UNeditReport::PrintTraverseInfo(double dE, double dN, double dH, double brg,
         ConvertAngleToDisplay(job, value, text, 0);
         return nedit::TrimLeft(text);
     };
-    W(Format(L"%s               %-20s %s             %-20s", Translate(L"Misclose Bearing"), angle_text(brg),
-             Translate(L"Distance"), job.DistanceToString(dist, false, false, 3, -1, false, false)),
+    W(Format(L"%s               %-20s %s             %-20s", Translate(L"Misclose Bearing"),
+             angle_text(brg), Translate(L"Distance"),
+             job.DistanceToString(dist, false, false, 3, -1, false, false)),
       0, 1);
     W(Format(L"%s                  %-20.3f %s      %-20s", Translate(L"Enclosed Area"),
              area > 0.0 ? area : 0.0, Translate(L"Traverse Length"),
@@ -277,26 +291,30 @@ int UNeditReport::PrintTraverseInfo(double dE, double dN, double dH, double brg,
     W(Format(L"%s                  %-20d %s             %-20s", Translate(L"No  of Setups"), setups,
              Translate(L"Accuracy"), accuracy),
       0, 1);
-    if (elevError) W(Format(L"%s                %-20s", Translate(L"Elevation Error"), height), 0, 1);
+    if (elevError)
+        W(Format(L"%s                %-20s", Translate(L"Elevation Error"), height), 0, 1);
     if (angle) {
-        W(Format(L"%s                  %-20s %s     %-20s", Translate(L"Known Bearing"), angle_text(known),
-                 Translate(L"Observed Bearing"), angle_text(observed)),
+        W(Format(L"%s                  %-20s %s     %-20s", Translate(L"Known Bearing"),
+                 angle_text(known), Translate(L"Observed Bearing"), angle_text(observed)),
           1, 1);
-        W(Format(L"%s                  %-20s %s           %-20s", Translate(L"Angular Error"), angle_text(angErr),
-                 Translate(L"PerStation"), angle_text(perStn)),
+        W(Format(L"%s                  %-20s %s           %-20s", Translate(L"Angular Error"),
+                 angle_text(angErr), Translate(L"PerStation"), angle_text(perStn)),
           0, 1);
     }
     return 1;
 }
 
-int UNeditReport::PrintMisclose(double dist, double brg, double accuracy, double area, double total) {
+int UNeditReport::PrintMisclose(double dist, double brg, double accuracy, double area,
+                                double total) {
     KeepLines(7);
     const double bearing = ConvertToAngleDisplayUnit(brg);
     const std::wstring accuracy_text =
         accuracy > 100000.0 ? std::wstring(L"100000+") : Format(L"%d", static_cast<int>(accuracy));
     W(Translate(L"Misclose {1} Direction {2}", {Dist(dist), Format(L"%.3f", bearing)}), 2, 1);
     if (total > 0.0) W(Translate(L"Total Distance {1}", {Dist(total)}), 0, 1);
-    if (area > 0.0) W(Format(L"%s           %-15.3f", Translate(L"Area"), ConvertToAreaDisplayUnit(area)), 0, 1);
+    if (area > 0.0)
+        W(Format(L"%s           %-15.3f", Translate(L"Area"), ConvertToAreaDisplayUnit(area)), 0,
+          1);
     W(Format(L"%s    1:%s", Translate(L"Error"), accuracy_text), 0, 4);
     return 1;
 }
@@ -330,22 +348,26 @@ void UNeditReport::PrintChkStn(const std::wstring& id, double ha, double va, dou
     NewLines(1);
 }
 
-void UNeditReport::PrintChkStnBlk(const std::wstring& /*stn*/, const std::wstring& target, double e, double n,
-                                  double h, double knownE, double knownN, double knownH, double brg,
-                                  double knownBrg, double brgDiff, double dist, double knownDist,
-                                  double distDiff) {
+void UNeditReport::PrintChkStnBlk(const std::wstring& /*stn*/, const std::wstring& target, double e,
+                                  double n, double h, double knownE, double knownN, double knownH,
+                                  double brg, double knownBrg, double brgDiff, double dist,
+                                  double knownDist, double distDiff) {
     const std::wstring pad(target.size() < 7 ? 7 - target.size() : 0, L' ');
     auto line = [&](const std::wstring& text) { W(pad + text, 0, 1); };
     constexpr const wchar_t* kRow = L"%-16s%16s%16s%16s";
     KeepLines(10);
-    line(Format(L"*********************** %s ****************************", Translate(L"CHECK POINT")));
+    line(Format(L"*********************** %s ****************************",
+                Translate(L"CHECK POINT")));
     line(Translate(L"                        Observed         Known        Difference"));
-    const std::wstring east_row = Format(kRow, Translate(L"Easting"), Dist(e), Dist(knownE), Dist(e - knownE));
-    const std::wstring north_row = Format(kRow, Translate(L"Northing"), Dist(n), Dist(knownN), Dist(n - knownN));
+    const std::wstring east_row =
+        Format(kRow, Translate(L"Easting"), Dist(e), Dist(knownE), Dist(e - knownE));
+    const std::wstring north_row =
+        Format(kRow, Translate(L"Northing"), Dist(n), Dist(knownN), Dist(n - knownN));
     line(XYFlag ? east_row : north_row);
     line(XYFlag ? north_row : east_row);
     line(Format(kRow, Translate(L"Height"), Dist(h), Dist(knownH), Dist(h - knownH)));
-    line(Format(kRow, Translate(L"Bearing"), FormatAngle(brg), FormatAngle(knownBrg), FormatAngle(brgDiff)));
+    line(Format(kRow, Translate(L"Bearing"), FormatAngle(brg), FormatAngle(knownBrg),
+                FormatAngle(brgDiff)));
     line(Format(kRow, Translate(L"Distance"), Dist(dist), Dist(knownDist), Dist(distDiff)));
     line(L"****************************************************************");
 }
@@ -358,7 +380,9 @@ void UNeditReport::PrintUndefinedCodeHead() {
     W(L"~~~~~~~~~~~~~~~", 0, 1);
 }
 
-void UNeditReport::PrintUndefined(const std::wstring& text) { W(text, 0, 1); }
+void UNeditReport::PrintUndefined(const std::wstring& text) {
+    W(text, 0, 1);
+}
 
 void UNeditReport::PrintPartOfArc(const std::wstring& name) {
     W(Translate(L"***Point {1} is Part of Arc & will not be Adjusted...", {name}), 0, 1);

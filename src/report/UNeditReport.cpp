@@ -26,11 +26,11 @@ constexpr double kMetresPerLink = 0.201168;
 // column heads.
 const std::map<std::wstring, const wchar_t*>& TitleDefaults() {
     static const std::map<std::wstring, const wchar_t*> kDefaults = {
-        {L"MSGHC", L"No Height"}, {L"COLID", L"PointID"},     {L"COLLN", L"Line"},
-        {L"COLHA", L"Horiz    "}, {L"COLVA", L"Vert     "},   {L"COLSD", L"SDist  "},
-        {L"COLHD", L"HDist  "},   {L"COLVD", L"VDist  "},     {L"COLHT", L"HTar  "},
-        {L"COLNC", L"North      "}, {L"COLEC", L"East      "}, {L"COLHC", L"Height   "},
-        {L"COLCO", L"  Code"},    {L"COLCHECK", L"CheckShot"},
+        {L"MSGHC", L"No Height"},   {L"COLID", L"PointID"},      {L"COLLN", L"Line"},
+        {L"COLHA", L"Horiz    "},   {L"COLVA", L"Vert     "},    {L"COLSD", L"SDist  "},
+        {L"COLHD", L"HDist  "},     {L"COLVD", L"VDist  "},      {L"COLHT", L"HTar  "},
+        {L"COLNC", L"North      "}, {L"COLEC", L"East      "},   {L"COLHC", L"Height   "},
+        {L"COLCO", L"  Code"},      {L"COLCHECK", L"CheckShot"},
     };
     return kDefaults;
 }
@@ -48,12 +48,18 @@ void CarrySexagesimal(long& d, long& m, long& s) {
     if (d > 359) d %= 360;
 }
 
-bool IsFeet(wchar_t unit) { return unit == L'1' || unit == L'F' || unit == L'I'; }
-bool IsUsFeet(wchar_t unit) { return unit == L'2' || unit == L'U'; }
+bool IsFeet(wchar_t unit) {
+    return unit == L'1' || unit == L'F' || unit == L'I';
+}
+bool IsUsFeet(wchar_t unit) {
+    return unit == L'2' || unit == L'U';
+}
 
 }  // namespace
 
-UNeditReport::UNeditReport(UNeditDoc* doc, const std::wstring& title) : UReportDoc(title) { Init(doc, title); }
+UNeditReport::UNeditReport(UNeditDoc* doc, const std::wstring& title) : UReportDoc(title) {
+    Init(doc, title);
+}
 
 UNeditReport::~UNeditReport() = default;
 
@@ -131,7 +137,8 @@ std::wstring UNeditReport::ConvertToDistDisplayUnit(double length, int decimals)
     } else if (OutUL == L'L') {
         value = metres / kMetresPerLink;
     }
-    if ((IsFeet(OutUL) || IsUsFeet(OutUL)) && Settings().GetFootFormat() != UJobSettings::kDecimalFeet) {
+    if ((IsFeet(OutUL) || IsUsFeet(OutUL)) &&
+        Settings().GetFootFormat() != UJobSettings::kDecimalFeet) {
         UJobSettings feet;
         feet.SetFootFormat(Settings().GetFootFormat());
         feet.SetFootInchPrecision(Settings().GetFootInchPrecision());
@@ -168,11 +175,14 @@ double UNeditReport::dms(double degrees) {
     long m = static_cast<long>(minutes);
     long s = static_cast<long>((minutes - static_cast<double>(m)) * 60.0 + 0.5);
     CarrySexagesimal(d, m, s);
-    const double result = static_cast<double>(d) + static_cast<double>(m) / 100.0 + static_cast<double>(s) / 10000.0;
+    const double result =
+        static_cast<double>(d) + static_cast<double>(m) / 100.0 + static_cast<double>(s) / 10000.0;
     return degrees < 0.0 ? -result : result;
 }
 
-bool UNeditReport::Sexagesimal() const { return AngleType() == 0; }
+bool UNeditReport::Sexagesimal() const {
+    return AngleType() == 0;
+}
 
 std::wstring UNeditReport::dmsString(double value) const {
     // The digits are taken from the value rounded to four places as a whole number: taking
@@ -195,8 +205,9 @@ std::wstring UNeditReport::dmsString(double value) const {
 std::wstring UNeditReport::deg2dmsString(double degrees) {
     const double packed = dms(degrees);
     const long long digits = std::llround(std::fabs(packed) * 10000.0);
-    std::wstring text = nedit::Format(L" %3d %2.2d'%2.2d", static_cast<long>(digits / 10000),
-                                      static_cast<long>(digits / 100 % 100), static_cast<long>(digits % 100));
+    std::wstring text =
+        nedit::Format(L" %3d %2.2d'%2.2d", static_cast<long>(digits / 10000),
+                      static_cast<long>(digits / 100 % 100), static_cast<long>(digits % 100));
     if (degrees < 0.0) text[0] = L'-';
     return text;
 }
@@ -210,7 +221,8 @@ int UNeditReport::AngleType() const {
 
 std::wstring UNeditReport::FormatAngle(double degrees) const {
     const int type = AngleType();
-    std::wstring text = UFormatAngle(type, 4, 0).ConvertToDisplayString(nedit::Format(L"%f", degrees));
+    std::wstring text =
+        UFormatAngle(type, 4, 0).ConvertToDisplayString(nedit::Format(L"%f", degrees));
     if (type != 0 || text.size() < 2) return text;
     // ddd.mmss shows as ddd mm'ss".
     text.insert(text.size() - 2, 1, L'\'');
@@ -220,7 +232,8 @@ std::wstring UNeditReport::FormatAngle(double degrees) const {
     return text;
 }
 
-void UNeditReport::geo_brgdst(double e1, double n1, double e2, double n2, double* brg, double* dst) {
+void UNeditReport::geo_brgdst(double e1, double n1, double e2, double n2, double* brg,
+                              double* dst) {
     const double de = e2 - e1;
     const double dn = n2 - n1;
     *dst = std::sqrt(dn * dn + de * de);
@@ -232,15 +245,20 @@ void UNeditReport::geo_brgdst(double e1, double n1, double e2, double n2, double
     if (*brg < 0.0) *brg += 360.0;
 }
 
-int UNeditReport::geo_zero(double value) { return std::fabs(value) <= 1e-5 ? 1 : 0; }
+int UNeditReport::geo_zero(double value) {
+    return std::fabs(value) <= 1e-5 ? 1 : 0;
+}
 
-bool UNeditReport::IsOn(int option) const { return Doc != nullptr && Doc->GetCheckOn(option) != 0; }
+bool UNeditReport::IsOn(int option) const {
+    return Doc != nullptr && Doc->GetCheckOn(option) != 0;
+}
 
 std::wstring UNeditReport::Height(double value) {
     return value > -10000.0 ? Dist(value) : GetTitleText(L"MSGHC");
 }
 
-std::pair<std::wstring, std::wstring> UNeditReport::InOrder(std::wstring east, std::wstring north) const {
+std::pair<std::wstring, std::wstring> UNeditReport::InOrder(std::wstring east,
+                                                            std::wstring north) const {
     if (XYFlag) return {std::move(east), std::move(north)};
     return {std::move(north), std::move(east)};
 }

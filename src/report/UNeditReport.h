@@ -18,7 +18,7 @@ class UNeditDoc;
 struct STNSTRUCT;
 
 class UNeditReport : public UReportDoc {
-public:
+  public:
     UNeditReport(UNeditDoc* doc, const std::wstring& title);
     ~UNeditReport() override;
 
@@ -72,39 +72,41 @@ public:
     void PrintHeadString(const std::wstring& key, const std::wstring& value);
     void PrintHeadCoord(double e, double n, double h);
     void PrintEdmHead();
-    void PrintOccStnBlk(const STNSTRUCT* station, const std::wstring& name, double e, double n, double h,
-                        const std::wstring& code, double insHt, double scale, const std::wstring& backStn,
-                        double backBearing, double backAngle);
+    void PrintOccStnBlk(const STNSTRUCT* station, const std::wstring& name, double e, double n,
+                        double h, const std::wstring& code, double insHt, double scale,
+                        const std::wstring& backStn, double backBearing, double backAngle);
     void PrintSSHead();
-    void PrintSSLine(const std::wstring& id, double ha, double va, double sd, double ht, double e, double n,
-                     double h, const std::wstring& code, int lineNo, bool full);
+    void PrintSSLine(const std::wstring& id, double ha, double va, double sd, double ht, double e,
+                     double n, double h, const std::wstring& code, int lineNo, bool full);
     int PrintOffset(double r, double t, double v);
     void PrintPTHeader();
-    void PrintPTRecord(const std::wstring& name, double e, double n, double h, const std::wstring& code);
+    void PrintPTRecord(const std::wstring& name, double e, double n, double h,
+                       const std::wstring& code);
     int PrintTravHead(const std::wstring& title, bool elevAdj);
     int PrintTravHead(int adjusted);
     int PrintCoord(const std::wstring& name, double e, double n, double h);
     int PrintCoord(const std::wstring& name, double e, double n);
-    int PrintLine(const std::wstring& name, double ha, double brg, double dist, double e, double n, double h,
-                  bool elevAdj, double adj);
+    int PrintLine(const std::wstring& name, double ha, double brg, double dist, double e, double n,
+                  double h, bool elevAdj, double adj);
     int PrintLine(const std::wstring& name, double ha, double brg, double dist, double e, double n);
-    int PrintTraverseInfo(double dE, double dN, double dH, double brg, double dist, double area, double length,
-                          int setups, const std::wstring& accuracy, bool elevError, bool angle, double angErr,
-                          double perStn, double known, double observed);
+    int PrintTraverseInfo(double dE, double dN, double dH, double brg, double dist, double area,
+                          double length, int setups, const std::wstring& accuracy, bool elevError,
+                          bool angle, double angErr, double perStn, double known, double observed);
     int PrintMisclose(double dist, double brg, double accuracy, double area, double total);
     int PrintAdjustedSideShotsHead(const std::wstring& text);
-    void PrintChkStn(const std::wstring& id, double ha, double va, double sd, double ht, const std::wstring& code,
-                     int lineNo);
-    void PrintChkStnBlk(const std::wstring& stn, const std::wstring& target, double e, double n, double h,
-                        double knownE, double knownN, double knownH, double brg, double knownBrg, double brgDiff,
-                        double dist, double knownDist, double distDiff);
+    void PrintChkStn(const std::wstring& id, double ha, double va, double sd, double ht,
+                     const std::wstring& code, int lineNo);
+    void PrintChkStnBlk(const std::wstring& stn, const std::wstring& target, double e, double n,
+                        double h, double knownE, double knownN, double knownH, double brg,
+                        double knownBrg, double brgDiff, double dist, double knownDist,
+                        double distDiff);
     void PrintUndefinedCodeHead();
     void PrintUndefined(const std::wstring& text);
     void PrintPartOfArc(const std::wstring& name);
     void PrintEndFile();
     void PrintPageHead(const std::wstring& text, int page);
 
-private:
+  private:
     /// W of the report's notation: line ends before, the text, line ends after.
     void W(const std::wstring& text, int before, int after) { WriteText(text, before, after, 0); }
     std::wstring Dist(double value) { return ConvertToDistDisplayUnit(value, 3); }

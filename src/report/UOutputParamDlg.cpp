@@ -3,7 +3,8 @@
 #include "report/NeditIni.h"
 
 UOutputParamDlg::UOutputParamDlg(const OutParamStruct& parameters) : Parameters(parameters) {
-    AngularRadio = parameters.AngularUnit == 1 || parameters.AngularUnit == 2 ? parameters.AngularUnit : 0;
+    AngularRadio =
+        parameters.AngularUnit == 1 || parameters.AngularUnit == 2 ? parameters.AngularUnit : 0;
     LinearRadio = parameters.LinearUnit == 1 || parameters.LinearUnit == 2 ? 1 : 0;
 }
 

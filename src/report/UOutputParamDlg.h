@@ -8,7 +8,7 @@
 #include "report/OutParamStruct.h"
 
 class UOutputParamDlg : public nedit::UDialogLogic {
-public:
+  public:
     static constexpr int kDialogId = 8012;
 
     explicit UOutputParamDlg(const OutParamStruct& parameters);
@@ -27,6 +27,6 @@ public:
 
     const OutParamStruct& GetParameters() const { return Parameters; }
 
-private:
+  private:
     OutParamStruct Parameters;
 };

@@ -13,7 +13,8 @@ namespace {
 // The lowest marker row: the list is searched from its last row upward.
 int FindMarker(const UListCtrl& list) {
     for (int row = list.GetItemCount() - 1; row >= 0; --row) {
-        if (nedit::ToUpper(nedit::TrimView(list.GetItemText(row))) == kAdjustedPointsMarker) return row;
+        if (nedit::ToUpper(nedit::TrimView(list.GetItemText(row))) == kAdjustedPointsMarker)
+            return row;
     }
     return -1;
 }
@@ -32,8 +33,8 @@ int UNeditDatabase::SaveAdjustedPt2CtrlList(UListCtrl* list) {
     // Working values, as the adjustment left them; rows below the marker are overwritten
     // one for one and rows past the last one written stay.
     for (const UNeditPt& point : TravPtList) {
-        const std::wstring text =
-            nedit::Format(L"%-10s ID=%s,E=%.3f,N=%.3f,H=%.3f", L"XYZ", point.GetID(), point.x, point.y, point.z);
+        const std::wstring text = nedit::Format(L"%-10s ID=%s,E=%.3f,N=%.3f,H=%.3f", L"XYZ",
+                                                point.GetID(), point.x, point.y, point.z);
         if (row < count) {
             list->SetRecord(row, text);
         } else {
@@ -56,7 +57,8 @@ int UNeditDatabase::SaveAdditionPt2CtrlList(UListCtrl* list) {
         const std::wstring text = FormatXYZRecord(point.GetID(), point.x, point.y, point.z);
         if (row < 0) {
             list->AddRecord(insert_at++, text);
-        } else if (!Is_Zero(point.x - e, false) || !Is_Zero(point.y - n, false) || !Is_Zero(point.z - h, false)) {
+        } else if (!Is_Zero(point.x - e, false) || !Is_Zero(point.y - n, false) ||
+                   !Is_Zero(point.z - h, false)) {
             list->DeleteItem(row);
             list->AddRecord(row, text);
         }

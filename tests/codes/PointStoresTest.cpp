@@ -7,9 +7,9 @@ TEST_F(PointStores, ObservedPointsWinOverPointRecords) {
     engine.SavePoint(L"P", 9, 9, 9, L"PT", 1, 2, 0);  // a PT record does not replace it
     EXPECT_DOUBLE_EQ(engine.SearchPt(L"P")->x, 1.0);
     engine.SavePoint(L"Q", 2, 2, 2, L"", 1, 2, 0);
-    engine.SavePoint(L"Q", 3, 3, 3, L"", 1, 2, 0);    // a second PT record does
+    engine.SavePoint(L"Q", 3, 3, 3, L"", 1, 2, 0);  // a second PT record does
     EXPECT_DOUBLE_EQ(engine.SearchPt(L"Q")->x, 3.0);
-    engine.SavePoint(L"Q", 4, 4, 4, L"", 0, 0, 1);    // an observation replaces a PT point
+    engine.SavePoint(L"Q", 4, 4, 4, L"", 0, 0, 1);  // an observation replaces a PT point
     EXPECT_FALSE(engine.SearchPt(L"Q")->IsPTRecord());
     EXPECT_TRUE(engine.SearchPt(L"Q")->IsPTInterpolated());
     engine.SavePoint(L"P", 5, 5, 5, L"  ", 0, 0, 0);  // an empty code keeps the old one

@@ -17,7 +17,7 @@
 namespace {
 
 class RawDataDocuments : public ::testing::Test {
-protected:
+  protected:
     void SetUp() override {
         job = USurveyDoc::CreateJob(dir.File("site.job"), nullptr);
         container = std::make_unique<URawDataContainer>(job.get());
@@ -52,7 +52,8 @@ protected:
 };
 
 const char* const kSurvey =
-    "#VERSION-1.0 NEUTRAL FILE\n\nunit ul=m,ua=d\nstn id=k,hi=1.0\nxyz e=5,n=6,h=7\n\nss id=q,ha=0,va=90,sd=10,ht=1\n";
+    "#VERSION-1.0 NEUTRAL FILE\n\nunit ul=m,ua=d\nstn id=k,hi=1.0\nxyz e=5,n=6,h=7\n\nss "
+    "id=q,ha=0,va=90,sd=10,ht=1\n";
 
 }  // namespace
 
@@ -62,8 +63,11 @@ TEST_F(RawDataDocuments, ImportSaveReopenAndExportKeepEveryRow) {
     EXPECT_EQ(name, L"Data1");
     // Blank lines of the file are left out, so no row after them is lost.
     const std::vector<std::wstring> rows = {
-        L"#VERSION-1.0 NEUTRAL FILE", L"UNIT      UL=M,UA=D", L"STN       ID=K,HI=1.0",
-        L"XYZ       ID=K,E=5,N=6,H=7", L"SS        ID=Q,HA=0,VA=90,SD=10,HT=1",
+        L"#VERSION-1.0 NEUTRAL FILE",
+        L"UNIT      UL=M,UA=D",
+        L"STN       ID=K,HI=1.0",
+        L"XYZ       ID=K,E=5,N=6,H=7",
+        L"SS        ID=Q,HA=0,VA=90,SD=10,HT=1",
     };
     EXPECT_EQ(RowsOf(L"Data1"), rows);
 
@@ -87,8 +91,11 @@ TEST_F(RawDataDocuments, ImportSaveReopenAndExportKeepEveryRow) {
 }
 
 TEST_F(RawDataDocuments, AReductionAddsTheCoordinatesItWasGiven) {
-    ASSERT_EQ(container->CreateNEditDocFromNeutralFile(L"", File("unknown.neu",
-              "#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nSTN ID=NEW,HI=1\nSS ID=Q,HA=0,VA=90,SD=10,HT=1\n")), 1);
+    ASSERT_EQ(container->CreateNEditDocFromNeutralFile(
+                  L"", File("unknown.neu",
+                            "#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nSTN ID=NEW,HI=1\nSS "
+                            "ID=Q,HA=0,VA=90,SD=10,HT=1\n")),
+              1);
     UNeditDoc* doc = container->GetNeditDoc(L"Data1");
     nedit::HeadlessDialogHost host;
     host.SetDialogScript(L"Control Point Coordinate", [](nedit::UDialogLogic& logic) {
@@ -99,7 +106,8 @@ TEST_F(RawDataDocuments, AReductionAddsTheCoordinatesItWasGiven) {
     doc->SetDialogHost(&host);
     UListCtrl& list = doc->OpenList();
     ASSERT_EQ(doc->SetupDataBase(&list), 1);
-    EXPECT_EQ(list.GetItemText(list.GetItemCount() - 1), L"XYZ       ID=NEW,E=100.000,N=200.000,H=30.000");
+    EXPECT_EQ(list.GetItemText(list.GetItemCount() - 1),
+              L"XYZ       ID=NEW,E=100.000,N=200.000,H=30.000");
     EXPECT_NE(doc->GetNReport()->GetText().find(L"Main Report"), std::wstring::npos);
     ASSERT_EQ(doc->SaveDocument(), 1);
     Reopen();
@@ -133,7 +141,8 @@ TEST_F(RawDataDocuments, AStreamReadStopsAtAnEmptyLineAndSaysSo) {
     ASSERT_EQ(doc->CreateDocument(L"Hand", container.get()), 1);
     UStreamFile stream;
     ASSERT_EQ(stream.CreateStream(*doc->GetStorage(), UNeditDoc::kNeutralDataStream, 4113), 1);
-    for (const wchar_t* line : {L"#VERSION-1.0 NEUTRAL FILE", L"STN ID=A", L"", L"SS ID=B", L"SS ID=C"}) {
+    for (const wchar_t* line :
+         {L"#VERSION-1.0 NEUTRAL FILE", L"STN ID=A", L"", L"SS ID=B", L"SS ID=C"}) {
         stream.WriteString(line);
     }
     stream.Close();
@@ -143,7 +152,8 @@ TEST_F(RawDataDocuments, AStreamReadStopsAtAnEmptyLineAndSaysSo) {
     ASSERT_EQ(doc->Load(&list), 1);
     EXPECT_EQ(list.GetItemCount(), 2);
     ASSERT_EQ(host.Messages().size(), 1u);
-    EXPECT_EQ(host.Messages()[0].text, L"The records of Hand end at an empty line; 2 further lines were not read.");
+    EXPECT_EQ(host.Messages()[0].text,
+              L"The records of Hand end at an empty line; 2 further lines were not read.");
     // A document whose stream is missing loads nothing.
     auto empty = std::make_unique<UNeditDoc>(job.get());
     ASSERT_EQ(empty->CreateDocument(L"Empty", container.get()), 1);

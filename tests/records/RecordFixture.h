@@ -7,7 +7,7 @@
 #include "records/UNeutralFileFormat.h"
 
 class RecordFixture : public ::testing::Test {
-protected:
+  protected:
     void SetUp() override { ASSERT_TRUE(format.LoadNeutralFileDefinition(L"" SXNEDIT_DATA_DIR)); }
 
     UJobSettings settings;

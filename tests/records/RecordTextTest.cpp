@@ -1,6 +1,6 @@
-#include "records/RecordText.h"
-
 #include <gtest/gtest.h>
+
+#include "records/RecordText.h"
 
 TEST(RecordText, TokensCountEverySeparator) {
     const std::wstring row = L"stn  id=a,hi=1.5";

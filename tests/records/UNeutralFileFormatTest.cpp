@@ -1,10 +1,9 @@
-#include "records/UNeutralFileFormat.h"
-
 #include <gtest/gtest.h>
 
 #include "RecordFixture.h"
 #include "platform/text/NumberText.h"
 #include "records/RecordTypes.h"
+#include "records/UNeutralFileFormat.h"
 
 using nedit::TextToDouble;
 
@@ -13,9 +12,9 @@ using NeutralFormat = RecordFixture;
 TEST_F(NeutralFormat, KeysAndFieldsAreKnownBothWays) {
     ASSERT_TRUE(format.IsKeysInitialised());
     const std::pair<int, const wchar_t*> records[] = {
-        {99, L"#"},      {104, L"UNIT"},  {109, L"PT"},      {110, L"STN"},     {111, L"BKB"},
-        {112, L"XYZ"},   {113, L"BS"},    {114, L"SS"},      {118, L"SCALE"},   {128, L"UNIT2"},
-        {133, L"PSX"},   {135, L"YXZ"},   {136, L"TARGETHT2"}, {137, L"IMAGE"}, {139, L"ATTRIB"},
+        {99, L"#"},    {104, L"UNIT"}, {109, L"PT"},        {110, L"STN"},   {111, L"BKB"},
+        {112, L"XYZ"}, {113, L"BS"},   {114, L"SS"},        {118, L"SCALE"}, {128, L"UNIT2"},
+        {133, L"PSX"}, {135, L"YXZ"},  {136, L"TARGETHT2"}, {137, L"IMAGE"}, {139, L"ATTRIB"},
     };
     for (const auto& [type, key] : records) {
         std::wstring found_key;
@@ -78,7 +77,9 @@ TEST_F(NeutralFormat, RecordShapesSingleFieldsAndRowTypes) {
 
 TEST_F(NeutralFormat, ValuesAreReadInTheFilesUnitsAndGivenInWorkingUnits) {
     // ddd.mmss: 123°45'30" is 123.758333°; 89°55' is 89.916667°.
-    ASSERT_EQ(format.ProcessRecord(rec::Ss, L"SS ID=P1,HA=123.4530,VA=89.5500,SD=35.214,HT=1.600,CO=FC01", fields), 1);
+    ASSERT_EQ(format.ProcessRecord(
+                  rec::Ss, L"SS ID=P1,HA=123.4530,VA=89.5500,SD=35.214,HT=1.600,CO=FC01", fields),
+              1);
     EXPECT_EQ(fields[fld::ID], L"P1");
     EXPECT_NEAR(TextToDouble(fields[fld::HA]), 123.7583333333, 1e-9);
     EXPECT_NEAR(TextToDouble(fields[fld::VA]), 89.9166666667, 1e-9);
@@ -168,7 +169,8 @@ TEST_F(NeutralFormat, FieldsAreNamedOrPositional) {
 TEST_F(NeutralFormat, RecordsAreLaidOutTheStandardWay) {
     EXPECT_EQ(format.FormatRecord(rec::Ss, L"SS ID=P2 , HA = 123.4530,VA=89.5500"),
               L"SS        ID=P2,HA=123.4530,VA=89.5500");
-    EXPECT_EQ(format.FormatRecord(rec::Stn, L"STN       ID=A,HI=0.000,CO= "), L"STN       ID=A,HI=0.000,CO=");
+    EXPECT_EQ(format.FormatRecord(rec::Stn, L"STN       ID=A,HI=0.000,CO= "),
+              L"STN       ID=A,HI=0.000,CO=");
     EXPECT_EQ(format.FormatRecord(rec::Scale, L"SCALE 0.99960"), L"SCALE     0.99960");
     EXPECT_EQ(format.FormatRecord(rec::Targetht2, L"TARGETHT2 1.5"), L"TARGETHT2 1.5");
     EXPECT_EQ(format.FormatRecord(rec::Stn, L"STN"), L"STN");

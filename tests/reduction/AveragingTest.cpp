@@ -62,5 +62,5 @@ TEST(Averaging, AngleHelpers) {
     EXPECT_NEAR(UNeditDatabase::chgDeg(123.4530), 123.7583333, 1e-7);
     EXPECT_NEAR(UNeditDatabase::chgDeg(-10.3000), -10.5, 1e-12);
     EXPECT_NEAR(UNeditDatabase::chgDeg(10.0075), 10.0 + 75.0 / 3600, 1e-9);  // 75 seconds stand
-    EXPECT_NEAR(UNeditDatabase::chgDeg(10.99995), 11.0, 1e-9);                // 99'100" carries twice
+    EXPECT_NEAR(UNeditDatabase::chgDeg(10.99995), 11.0, 1e-9);  // 99'100" carries twice
 }

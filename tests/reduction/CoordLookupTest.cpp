@@ -33,8 +33,9 @@ TEST_F(CoordLookup, TheBearingStoreAnswersBothWays) {
 }
 
 TEST_F(CoordLookup, SetCoordWritesEveryNodeOfTheNameOrMakesAPointNode) {
-    Rows(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
-         L"STN ID=A\nSS ID=P,HA=0,VA=90,SD=1,HT=0\nSTN ID=A\nSS ID=Q,HA=0,VA=90,SD=1,HT=0\n");
+    Rows(
+        L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
+        L"STN ID=A\nSS ID=P,HA=0,VA=90,SD=1,HT=0\nSTN ID=A\nSS ID=Q,HA=0,VA=90,SD=1,HT=0\n");
     ASSERT_EQ(engine.PrepareList(), 1);
     EXPECT_EQ(engine.setCoord(L"A", 1.0, 2.0, 3.0, L"CP", 8, 1, 1), 1);
     for (const auto& station : engine.GetStations()) {
@@ -86,7 +87,8 @@ TEST_F(CoordLookup, AFieldCoordinateIsConfirmedOnceThenRemembered) {
 }
 
 TEST_F(CoordLookup, RowsWrittenForTheUserAreLaidOutAsRecords) {
-    EXPECT_EQ(engine.FormatXYZRecord(L"B", 1.23456, 2.0, -0.5), L"XYZ      ID=B,E=1.235,N=2.000,H=-0.500");
+    EXPECT_EQ(engine.FormatXYZRecord(L"B", 1.23456, 2.0, -0.5),
+              L"XYZ      ID=B,E=1.235,N=2.000,H=-0.500");
     // Angles in the job's unit (ddd.mmss) with its four decimals: 45.5° is 45°30'.
     EXPECT_EQ(engine.FormatBKBRecord(L"B", 0.0, 45.5), L"BKB      ID=B,HA=0.0000,BRG=45.3000");
 }

@@ -5,10 +5,11 @@
 using ExportedOperations = ReductionFixture;
 
 TEST_F(ExportedOperations, ForwardPointersPairedOnlyWithTheBackStation) {
-    Rows(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
-         L"STN ID=A\nSS ID=B,HA=0,VA=90,SD=1,HT=0\nSS ID=C,HA=0,VA=90,SD=1,HT=0\n"
-         L"STN ID=B\nBKB ID=A,HA=0\nSS ID=X,HA=0,VA=90,SD=1,HT=0\n"
-         L"STN ID=C\nBKB ID=Z,HA=0\nSS ID=Y,HA=0,VA=90,SD=1,HT=0\n");
+    Rows(
+        L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
+        L"STN ID=A\nSS ID=B,HA=0,VA=90,SD=1,HT=0\nSS ID=C,HA=0,VA=90,SD=1,HT=0\n"
+        L"STN ID=B\nBKB ID=A,HA=0\nSS ID=X,HA=0,VA=90,SD=1,HT=0\n"
+        L"STN ID=C\nBKB ID=Z,HA=0\nSS ID=Y,HA=0,VA=90,SD=1,HT=0\n");
     ASSERT_EQ(engine.PrepareList(), 1);
     ASSERT_EQ(engine.PrepareForwardWithBS(), 1);
     const STNSTRUCT* a = engine.searchSTN(L"A");
@@ -34,7 +35,8 @@ TEST_F(ExportedOperations, NewStationsReRunsAndPlainGeometry) {
     EXPECT_TRUE(engine.GetStations().empty());
 
     // A re-run from given rows prints into no report here, and reduces as Process would.
-    engine.Generate({L"#VERSION-1.0 NEUTRAL FILE", L"UNIT UL=M,UA=D", L"PT ID=P,E=3,N=4,H=0"}, true);
+    engine.Generate({L"#VERSION-1.0 NEUTRAL FILE", L"UNIT UL=M,UA=D", L"PT ID=P,E=3,N=4,H=0"},
+                    true);
     EXPECT_GE(engine.GetPointIdx(L"P"), 0);
     EXPECT_DOUBLE_EQ(engine.GetDocExtents().GetMaxX(), 3.0);  // one point: a box of no size
 

@@ -3,15 +3,15 @@
 #include <gtest/gtest.h>
 
 #include "../support/TestSupport.h"
-#include "platform/job/USurveyDoc.h"
 #include "ReductionFixture.h"
 #include "platform/job/UDBPoint.h"
+#include "platform/job/USurveyDoc.h"
 #include "reduction/UCoordEntryDlg.h"
 
 namespace {
 
 class JobSource : public ReductionFixture {
-protected:
+  protected:
     void SetUp() override {
         ReductionFixture::SetUp();
         job = USurveyDoc::CreateJob(dir.File("site.job"), nullptr);
@@ -43,9 +43,10 @@ TEST_F(JobSource, TheJobsPointIsOfferedFirstAndRememberedOnceTaken) {
         return dialog.OnOK() ? nedit::mb::IdOk : nedit::mb::IdCancel;
     });
     UNeditDatabase on_job(&format, &list, job.get(), &host);
-    Rows(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
-         L"STN ID=CP1,HI=1.5\nXYZ ID=CP1,E=1,N=2,H=3\nBKB ID=R,BRG=90,HA=0\n"
-         L"SS ID=Q,HA=0,VA=90,SD=10,HT=1.5\n");
+    Rows(
+        L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
+        L"STN ID=CP1,HI=1.5\nXYZ ID=CP1,E=1,N=2,H=3\nBKB ID=R,BRG=90,HA=0\n"
+        L"SS ID=Q,HA=0,VA=90,SD=10,HT=1.5\n");
     ASSERT_EQ(on_job.Process(), 1);
     // Q lies 10 m East of the job's CP1.
     const UNeditPt* q = on_job.SearchPt(L"Q");

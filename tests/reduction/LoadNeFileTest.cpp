@@ -12,13 +12,16 @@
 namespace {
 
 class LoadNeFile : public RecordFixture {
-protected:
-    int Load(const std::string& path) { return engine.LoadNeFile(std::wstring(path.begin(), path.end())); }
+  protected:
+    int Load(const std::string& path) {
+        return engine.LoadNeFile(std::wstring(path.begin(), path.end()));
+    }
 
     int LoadBytes(const std::string& bytes) {
         // Named after the test, since test processes run side by side.
         const std::string path = ::testing::TempDir() +
-                                 ::testing::UnitTest::GetInstance()->current_test_info()->name() + ".neu";
+                                 ::testing::UnitTest::GetInstance()->current_test_info()->name() +
+                                 ".neu";
         std::ofstream(path, std::ios::binary) << bytes;
         return Load(path);
     }
@@ -50,7 +53,8 @@ TEST_F(LoadNeFile, ALowerCaseFieldFileBecomesTheRowsOfTheList) {
     ASSERT_EQ(Load(SXNEDIT_TEST_DATA "/lowercase.neu"), 1);
     // The 300-character side shot is cut to 255 on reading; laid out with its key padded to
     // ten places it would grow by eight, and the row is cut to 255 again.
-    const std::wstring long_row_start = L"SS        ID=P9,HA=10.0000,VA=90.0000,SD=5.000,HT=1.500,CO=";
+    const std::wstring long_row_start =
+        L"SS        ID=P9,HA=10.0000,VA=90.0000,SD=5.000,HT=1.500,CO=";
     const std::wstring long_row = long_row_start + std::wstring(255 - long_row_start.size(), L'X');
     const std::vector<std::wstring> expected = {
         kHeader,
@@ -72,13 +76,13 @@ TEST_F(LoadNeFile, ALowerCaseFieldFileBecomesTheRowsOfTheList) {
 
 TEST_F(LoadNeFile, CoordinateRecordsTakeTheNameOfTheStationAbove) {
     ASSERT_EQ(LoadBytes("#VERSION-1.0 NEUTRAL FILE\n"
-                        "XYZ E=1,N=2,H=3\n"                  // before any station: empty name
+                        "XYZ E=1,N=2,H=3\n"  // before any station: empty name
                         "STN ID=A,HI=1.5\n"
                         "XYZ E=10,N=20,H=30\n"
-                        "XYZ ID=Q,E=11,N=21,H=31\n"          // three commas: its own name
+                        "XYZ ID=Q,E=11,N=21,H=31\n"  // three commas: its own name
                         "BKB ID=D,BRG=45.0000,HA=0.0000\n"
-                        "XYZ E=12,N=22\n"                    // takes the back station's name
-                        "XYZ 5\n"),                          // no comma: unchanged
+                        "XYZ E=12,N=22\n"  // takes the back station's name
+                        "XYZ 5\n"),        // no comma: unchanged
               1);
     const std::vector<std::wstring> expected = {
         kHeader,
@@ -96,7 +100,9 @@ TEST_F(LoadNeFile, CoordinateRecordsTakeTheNameOfTheStationAbove) {
 TEST_F(LoadNeFile, FilesThatCannotBeReadSayWhy) {
     const std::string missing = ::testing::TempDir() + "missing.neu";
     EXPECT_EQ(Load(missing), 0);
-    EXPECT_EQ(Messages(), std::vector<std::wstring>{L"Failed to open " + std::wstring(missing.begin(), missing.end()) + L"."});
+    EXPECT_EQ(Messages(),
+              std::vector<std::wstring>{L"Failed to open " +
+                                        std::wstring(missing.begin(), missing.end()) + L"."});
     EXPECT_EQ(host.Messages()[0].flags & nedit::mb::IconMask, nedit::mb::IconStop);
     EXPECT_EQ(list.GetItemCount(), 0);
 
@@ -106,7 +112,9 @@ TEST_F(LoadNeFile, FilesThatCannotBeReadSayWhy) {
     EXPECT_EQ(list.GetItemCount(), 0);
 
     EXPECT_EQ(LoadBytes("STN ID=A\n"), 0);
-    const char binary[] = "\x7F" "ELF\x02\x01\x01\0\0\0garbage\xFF\xFE";
+    const char binary[] =
+        "\x7F"
+        "ELF\x02\x01\x01\0\0\0garbage\xFF\xFE";
     EXPECT_EQ(LoadBytes(std::string(binary, sizeof binary - 1)), 0);
     EXPECT_EQ(Messages().size(), 4u);
 
@@ -122,18 +130,26 @@ TEST_F(LoadNeFile, FilesThatCannotBeReadSayWhy) {
 
 TEST_F(LoadNeFile, OddEncodingsAndLineEndsStillReadWell) {
     // A byte-order mark, CR LF and lone CR line ends, a tab, and a Latin-1 code.
-    ASSERT_EQ(LoadBytes("\xEF\xBB\xBF#version-1.0 neutral file\r\nstn\tid=a,co=caf\xE9\rpt id=b,e=1\r\n"), 1);
-    const std::vector<std::wstring> expected = {kHeader, L"STN       ID=A,CO=CAF\u00c9", L"PT        ID=B,E=1"};
+    ASSERT_EQ(
+        LoadBytes("\xEF\xBB\xBF#version-1.0 neutral file\r\nstn\tid=a,co=caf\xE9\rpt id=b,e=1\r\n"),
+        1);
+    const std::vector<std::wstring> expected = {kHeader, L"STN       ID=A,CO=CAF\u00c9",
+                                                L"PT        ID=B,E=1"};
     EXPECT_EQ(Rows(), expected);
 
     // UTF-8 stays UTF-8, upper-cased; binary junk after the header survives as comments.
-    ASSERT_EQ(LoadBytes("#VERSION-1.0 NEUTRAL FILE\nSS ID=\xC3\xA9t\xC3\xA9\n\x01\x02\x03\n\x80\x81junk\n"), 1);
-    const std::vector<std::wstring> junk = {kHeader, L"SS        ID=\u00c9T\u00c9", L"# \u0080\u0081JUNK"};
+    ASSERT_EQ(
+        LoadBytes(
+            "#VERSION-1.0 NEUTRAL FILE\nSS ID=\xC3\xA9t\xC3\xA9\n\x01\x02\x03\n\x80\x81junk\n"),
+        1);
+    const std::vector<std::wstring> junk = {kHeader, L"SS        ID=\u00c9T\u00c9",
+                                            L"# \u0080\u0081JUNK"};
     EXPECT_EQ(Rows(), junk);
 }
 
 TEST_F(LoadNeFile, VeryLongLinesAreCutNotLost) {
-    std::string bytes = "#VERSION-1.0 NEUTRAL FILE\nNOTE " + std::string(100000, 'n') + "\nSTN ID=Z\n";
+    std::string bytes =
+        "#VERSION-1.0 NEUTRAL FILE\nNOTE " + std::string(100000, 'n') + "\nSTN ID=Z\n";
     ASSERT_EQ(LoadBytes(bytes), 1);
     ASSERT_EQ(list.GetItemCount(), 3);
     EXPECT_EQ(list.GetItemText(1), L"NOTE      " + std::wstring(245, L'N'));

@@ -5,17 +5,19 @@ using PrepareList = ReductionFixture;
 namespace {
 const STNSTRUCT* StationNamed(const UNeditDatabase& engine, const std::wstring& name) {
     for (const auto& station : engine.GetStations()) {
-        if (station->StnName == name && !station->ReverseStn && !station->PointOnly) return station.get();
+        if (station->StnName == name && !station->ReverseStn && !station->PointOnly)
+            return station.get();
     }
     return nullptr;
 }
 }  // namespace
 
 TEST_F(PrepareList, RepeatedObservationsGatherUnderOneTargetPerListAndStation) {
-    Rows(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
-         L"STN ID=A\nBS ID=T,HA=1,VA=90,SD=5,HT=0\n"
-         L"SS ID=T,HA=10,VA=90,SD=5,HT=0,CO=FIRST\nSS ID=T,HA=11,VA=90,SD=5,HT=0,CO=SECOND\n"
-         L"STN ID=B\nSS ID=T,HA=12,VA=90,SD=5,HT=0\nSS ID=U,HA=0,VA=90,SD=1,HT=0\n");
+    Rows(
+        L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
+        L"STN ID=A\nBS ID=T,HA=1,VA=90,SD=5,HT=0\n"
+        L"SS ID=T,HA=10,VA=90,SD=5,HT=0,CO=FIRST\nSS ID=T,HA=11,VA=90,SD=5,HT=0,CO=SECOND\n"
+        L"STN ID=B\nSS ID=T,HA=12,VA=90,SD=5,HT=0\nSS ID=U,HA=0,VA=90,SD=1,HT=0\n");
     ASSERT_EQ(engine.PrepareList(), 1);
     const STNSTRUCT* a = StationNamed(engine, L"A");
     const STNSTRUCT* b = StationNamed(engine, L"B");
@@ -34,19 +36,20 @@ TEST_F(PrepareList, RepeatedObservationsGatherUnderOneTargetPerListAndStation) {
 }
 
 TEST_F(PrepareList, SwingInstrumentHeightAndScaleRunDownAsTheyShould) {
-    Rows(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
-         L"SWING 10\n"                                     // before any station: reaches all
-         L"STN ID=A,HI=0.00005\n"                         // below 0.0001: takes CurInstHt
-         L"SWING 5\n"                                      // inside A before observing: A only
-         L"SS ID=P,HA=0,VA=90,SD=1,HT=0\n"
-         L"SWING 7\n"                                      // after the first observation: nothing
-         L"STN ID=B,HI=0.0001\n"
-         L"INSHT 1.7\n"                                    // B has a height: only CurInstHt moves
-         L"SCALE 0\n"                                      // zero returns the factor to 1
-         L"SS ID=Q,HA=0,VA=90,SD=1,HT=0\n"
-         L"STN ID=C\n"
-         L"SCALE 0.5\n"
-         L"SS ID=R,HA=0,VA=90,SD=1,HT=0\n");
+    Rows(
+        L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
+        L"SWING 10\n"             // before any station: reaches all
+        L"STN ID=A,HI=0.00005\n"  // below 0.0001: takes CurInstHt
+        L"SWING 5\n"              // inside A before observing: A only
+        L"SS ID=P,HA=0,VA=90,SD=1,HT=0\n"
+        L"SWING 7\n"  // after the first observation: nothing
+        L"STN ID=B,HI=0.0001\n"
+        L"INSHT 1.7\n"  // B has a height: only CurInstHt moves
+        L"SCALE 0\n"    // zero returns the factor to 1
+        L"SS ID=Q,HA=0,VA=90,SD=1,HT=0\n"
+        L"STN ID=C\n"
+        L"SCALE 0.5\n"
+        L"SS ID=R,HA=0,VA=90,SD=1,HT=0\n");
     CurInstHt = 1.2;
     ASSERT_EQ(engine.PrepareList(), 1);
     const STNSTRUCT* a = StationNamed(engine, L"A");
@@ -67,15 +70,16 @@ TEST_F(PrepareList, SwingInstrumentHeightAndScaleRunDownAsTheyShould) {
 }
 
 TEST_F(PrepareList, EmptyStationsAreDroppedAndTheirPointNamesMoveOn) {
-    Rows(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
-         L"PT ID=K1,E=1,N=2,H=3\n"
-         L"STN ID=DROPPED\n"
-         L"STN ID=A\n"
-         L"PT ID=K2,E=1,N=1,H=1\n"
-         L"SS ID=P,HA=0,VA=90,SD=1,HT=0\n"
-         L"PT ID=K3,E=1,N=1,H=1\n"
-         L"SS ID=P,HA=0,VA=90,SD=2,HT=0\n"
-         L"STN ID=LAST\n");
+    Rows(
+        L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
+        L"PT ID=K1,E=1,N=2,H=3\n"
+        L"STN ID=DROPPED\n"
+        L"STN ID=A\n"
+        L"PT ID=K2,E=1,N=1,H=1\n"
+        L"SS ID=P,HA=0,VA=90,SD=1,HT=0\n"
+        L"PT ID=K3,E=1,N=1,H=1\n"
+        L"SS ID=P,HA=0,VA=90,SD=2,HT=0\n"
+        L"STN ID=LAST\n");
     ASSERT_EQ(engine.PrepareList(), 1);
     EXPECT_EQ(StationNamed(engine, L"DROPPED"), nullptr);
     const STNSTRUCT* a = StationNamed(engine, L"A");
@@ -96,8 +100,9 @@ TEST_F(PrepareList, TheDistanceCorrectionFollowsTheEarthAndRefraction) {
     // D 1000, zenith 88, R 6 370 000, k 0.13: a = D sin z / 2R, b = k a; worked separately
     // with the field programs' single-precision degree constants to D' = 999.9972663 and
     // z' = 87.9960867 (exact constants would give 87.9960842).
-    Rows(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nRADIUS 6370000\nDCORR 0.13\n"
-         L"STN ID=A\nSS ID=P,HA=0,VA=88,SD=1000,HT=0\nSS ID=TINY,HA=0,VA=88,SD=1e-41,HT=0\n");
+    Rows(
+        L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nRADIUS 6370000\nDCORR 0.13\n"
+        L"STN ID=A\nSS ID=P,HA=0,VA=88,SD=1000,HT=0\nSS ID=TINY,HA=0,VA=88,SD=1e-41,HT=0\n");
     ASSERT_EQ(engine.PrepareList(), 1);
     const STNSTRUCT* a = StationNamed(engine, L"A");
     ASSERT_NE(a, nullptr);
@@ -109,9 +114,10 @@ TEST_F(PrepareList, TheDistanceCorrectionFollowsTheEarthAndRefraction) {
 }
 
 TEST_F(PrepareList, SideShotsOnOccupiedStationsBecomeForwardTargets) {
-    Rows(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
-         L"STN ID=A\nSS ID=B,HA=0,VA=90,SD=1,HT=0\nSS ID=X,HA=0,VA=90,SD=1,HT=0\n"
-         L"STN ID=B\nSS ID=A,HA=0,VA=90,SD=1,HT=0\n");
+    Rows(
+        L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n"
+        L"STN ID=A\nSS ID=B,HA=0,VA=90,SD=1,HT=0\nSS ID=X,HA=0,VA=90,SD=1,HT=0\n"
+        L"STN ID=B\nSS ID=A,HA=0,VA=90,SD=1,HT=0\n");
     ASSERT_EQ(engine.PrepareList(), 1);
     ASSERT_EQ(engine.PrepareForwardNoBS(), 1);
     const STNSTRUCT* a = StationNamed(engine, L"A");

@@ -12,7 +12,7 @@
 #include "reduction/UNeditDatabase.h"
 
 class ReductionFixture : public RecordFixture {
-protected:
+  protected:
     /// Puts each line of `text` into the list, as the loader would.
     void Rows(const std::wstring& text) {
         list.DeleteAllItems();
@@ -30,7 +30,8 @@ protected:
         return index < 0 ? kNone : engine.GetPointList()[static_cast<std::size_t>(index)];
     }
 
-    void ExpectPoint(const std::wstring& name, double e, double n, double h, double tolerance = 1e-6) {
+    void ExpectPoint(const std::wstring& name, double e, double n, double h,
+                     double tolerance = 1e-6) {
         const UNeditPt& point = Point(name);
         EXPECT_NEAR(point.x, e, tolerance) << "East of " << std::string(name.begin(), name.end());
         EXPECT_NEAR(point.y, n, tolerance) << "North of " << std::string(name.begin(), name.end());

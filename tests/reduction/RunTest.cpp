@@ -17,7 +17,7 @@ TEST_F(ReductionRun, OnlyContentRowsCountAsModifications) {
     list.SetRecord(1, L"NOTE B");
     list.AddRecord(2, L"# a comment");
     EXPECT_FALSE(engine.IsContentModified());
-    list.SetRecord(3, L"STN ID=A, HI=1.5");   // layout only
+    list.SetRecord(3, L"STN ID=A, HI=1.5");  // layout only
     list.SetRecord(4, L"ss id=p1,ha=1,va=90,sd=5,ht=1.5");
     EXPECT_FALSE(engine.IsContentModified());
     list.SetRecord(4, L"SS ID=P1,HA=1,VA=90,SD=6,HT=1.5");
@@ -45,9 +45,10 @@ TEST(RunErrors, TheErrorTableNamesEachCode) {
 }
 
 TEST_F(ReductionRun, ASecondRunOnOneEngineGivesTheSameResult) {
-    Rows(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nPT ID=K1,E=1,N=2,H=3\nSTN ID=A,HI=1.5\n"
-         L"XYZ ID=A,E=0,N=0,H=0\nBKB ID=B,BRG=0,HA=0\nSS ID=P,HA=90,VA=90,SD=10,HT=1.5\n"
-         L"PT ID=K2,E=5,N=5,H=5\nSS ID=P,HA=90,VA=90,SD=12,HT=1.5\n");
+    Rows(
+        L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nPT ID=K1,E=1,N=2,H=3\nSTN ID=A,HI=1.5\n"
+        L"XYZ ID=A,E=0,N=0,H=0\nBKB ID=B,BRG=0,HA=0\nSS ID=P,HA=90,VA=90,SD=10,HT=1.5\n"
+        L"PT ID=K2,E=5,N=5,H=5\nSS ID=P,HA=90,VA=90,SD=12,HT=1.5\n");
     ASSERT_EQ(engine.Process(), 1);
     const UNeditPt first = Point(L"P");
     ASSERT_EQ(engine.Process(), 1);

@@ -13,7 +13,7 @@
 #include "report/UNeditReport.h"
 
 class ReportFixture : public ::testing::Test {
-protected:
+  protected:
     /// A document and report reading `ini` as NEDIT.INI; pages are endless.
     void Open(const std::string& ini, USurveyDoc* job = nullptr) {
         config.Write("NEDIT.INI", ini);
@@ -38,4 +38,5 @@ protected:
 /// Labels of the head lines used by the tests.
 inline const char* const kTitles =
     "[TITLE]\nOCCSTN=Occupied Station\nCOORD=Coordinates\nCODE=Code\nINSHT=Instrument Height\n"
-    "BACKSTN=Back Station\nBSBEARING=Back Bearing\nBSOBS=Back Sight Obs\nBSANGLE=Back Sight Angle\n";
+    "BACKSTN=Back Station\nBSBEARING=Back Bearing\nBSOBS=Back Sight Obs\nBSANGLE=Back Sight "
+    "Angle\n";

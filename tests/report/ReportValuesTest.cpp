@@ -1,15 +1,14 @@
 // The report's conversions of stored values to output text.
 
-#include "ReportFixture.h"
-#include "report/NeditIni.h"
-#include "report/OutParamStruct.h"
-#include "report/UOutputParamDlg.h"
-
 #include <sys/stat.h>
 
 #include <cmath>
 
+#include "ReportFixture.h"
 #include "platform/job/USurveyDoc.h"
+#include "report/NeditIni.h"
+#include "report/OutParamStruct.h"
+#include "report/UOutputParamDlg.h"
 
 namespace {
 using ReportValues = ReportFixture;
@@ -77,7 +76,8 @@ TEST_F(ReportValues, FeetAndInchesFollowTheJob) {
     job->GetSettings().SetFootInchPrecision(8);
     Open("", job.get());
     report->SetOutUL(1);
-    // 1 m = 3.2808399 ft = 3' 3.37", which is 3' 3 3/8" to the nearest eighth; decimals do not count.
+    // 1 m = 3.2808399 ft = 3' 3.37", which is 3' 3 3/8" to the nearest eighth; decimals do not
+    // count.
     EXPECT_EQ(report->ConvertToDistDisplayUnit(1.0, 3), L"3' 3 3/8\"");
     EXPECT_EQ(report->ConvertToDistDisplayUnit(1.0, 0), L"3' 3 3/8\"");
 }

@@ -19,12 +19,18 @@ struct Button {
 std::vector<Button> ButtonsOf(unsigned flags) {
     using namespace nedit::mb;
     switch (flags & ButtonsMask) {
-        case OkCancel: return {{"o", "OK", IdOk}, {"c", "Cancel", IdCancel}};
-        case AbortRetryIgnore: return {{"a", "Abort", IdAbort}, {"r", "Retry", IdRetry}, {"i", "Ignore", IdIgnore}};
-        case YesNoCancel: return {{"y", "Yes", IdYes}, {"n", "No", IdNo}, {"c", "Cancel", IdCancel}};
-        case YesNo: return {{"y", "Yes", IdYes}, {"n", "No", IdNo}};
-        case RetryCancel: return {{"r", "Retry", IdRetry}, {"c", "Cancel", IdCancel}};
-        default: return {{"o", "OK", IdOk}};
+        case OkCancel:
+            return {{"o", "OK", IdOk}, {"c", "Cancel", IdCancel}};
+        case AbortRetryIgnore:
+            return {{"a", "Abort", IdAbort}, {"r", "Retry", IdRetry}, {"i", "Ignore", IdIgnore}};
+        case YesNoCancel:
+            return {{"y", "Yes", IdYes}, {"n", "No", IdNo}, {"c", "Cancel", IdCancel}};
+        case YesNo:
+            return {{"y", "Yes", IdYes}, {"n", "No", IdNo}};
+        case RetryCancel:
+            return {{"r", "Retry", IdRetry}, {"c", "Cancel", IdCancel}};
+        default:
+            return {{"o", "OK", IdOk}};
     }
 }
 
@@ -67,7 +73,8 @@ int ConsoleDialogHost::AskMessage(const std::wstring& text, unsigned flags) {
     std::fprintf(stderr, "%s\n", nedit::ToUtf8(text).c_str());
     if (buttons.size() == 1) return buttons[0].answer;
     std::string prompt = "[";
-    for (const Button& button : buttons) prompt += std::string(prompt.size() > 1 ? "/" : "") + button.key + " " + button.label;
+    for (const Button& button : buttons)
+        prompt += std::string(prompt.size() > 1 ? "/" : "") + button.key + " " + button.label;
     prompt += "] ";
     const std::string answer = ReadAnswer(prompt);
     for (const Button& button : buttons) {
@@ -78,19 +85,25 @@ int ConsoleDialogHost::AskMessage(const std::wstring& text, unsigned flags) {
 
 int ConsoleDialogHost::AskCoordinates(UCoordEntryDlg& dialog) {
     using Source = UCoordEntryDlg::Source;
-    std::fprintf(stderr, "Control Point Coordinate: %s\nSelect the desired source or enter the point coordinates.\n",
-                 nedit::ToUtf8(dialog.GetName()).c_str());
+    std::fprintf(
+        stderr,
+        "Control Point Coordinate: %s\nSelect the desired source or enter the point coordinates.\n",
+        nedit::ToUtf8(dialog.GetName()).c_str());
     const std::pair<Source, const char*> sources[] = {{Source::Database, "d  Database Coordinate"},
                                                       {Source::Field, "f  Field Coordinate"}};
     for (const auto& [source, label] : sources) {
         if (!dialog.IsOffered(source)) continue;
         const UCoordEntryDlg::Row& row = dialog.RowOf(source);
-        std::fprintf(stderr, "  %s  E %.3f  N %.3f  H %.3f\n", label, row.East, row.North, row.Height);
+        std::fprintf(stderr, "  %s  E %.3f  N %.3f  H %.3f\n", label, row.East, row.North,
+                     row.Height);
     }
     std::fprintf(stderr, "  e  Enter Coordinate\n  c  Cancel\n");
-    const std::string choice = ReadAnswer("Source [" + std::string(dialog.GetSelectedSource() == Source::Database ? "d"
-                                                                  : dialog.GetSelectedSource() == Source::Field ? "f"
-                                                                                                               : "e") + "]: ");
+    const std::string choice =
+        ReadAnswer("Source [" +
+                   std::string(dialog.GetSelectedSource() == Source::Database ? "d"
+                               : dialog.GetSelectedSource() == Source::Field  ? "f"
+                                                                              : "e") +
+                   "]: ");
     if (choice == "c") return nedit::mb::IdCancel;
     if (choice == "d") dialog.SelectSource(Source::Database);
     if (choice == "f") dialog.SelectSource(Source::Field);

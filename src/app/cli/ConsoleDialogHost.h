@@ -14,7 +14,7 @@ class UBKBCoordDlg;
 class UCoordEntryDlg;
 
 class ConsoleDialogHost : public nedit::DialogHost {
-public:
+  public:
     /// `echo` prints each message on standard error as it is shown.
     explicit ConsoleDialogHost(bool interactive = false, bool echo = true)
         : Interactive(interactive), Echo(echo) {}
@@ -26,7 +26,7 @@ public:
     void SetEcho(bool echo) { Echo = echo; }
     const std::vector<std::wstring>& Messages() const { return MessagesShown; }
 
-private:
+  private:
     int AskMessage(const std::wstring& text, unsigned flags);
     int AskCoordinates(UCoordEntryDlg& dialog);
     int AskBackStation(UBKBCoordDlg& dialog);

@@ -19,10 +19,14 @@
 namespace {
 
 const char* const kDocUsage =
-    "sxnedit: doc takes one of: list JOB, import JOB FILE.neu [--name NAME], export JOB NAME FILE.neu,\n"
-    "reduce JOB NAME [--report OUT|-] [--json], rename JOB OLD NEW, delete JOB NAME (see sxnedit --help)\n";
+    "sxnedit: doc takes one of: list JOB, import JOB FILE.neu [--name NAME], export JOB NAME "
+    "FILE.neu,\n"
+    "reduce JOB NAME [--report OUT|-] [--json], rename JOB OLD NEW, delete JOB NAME (see sxnedit "
+    "--help)\n";
 
-std::wstring Wide(const std::string& text) { return nedit::FromUtf8(text); }
+std::wstring Wide(const std::string& text) {
+    return nedit::FromUtf8(text);
+}
 
 /// A job opened with its raw-data container.
 struct OpenJob {
@@ -74,7 +78,8 @@ int Import(OpenJob& open, const std::string& file, const std::string& wanted) {
         std::fprintf(stderr, "sxnedit: the document could not be named %s\n", wanted.c_str());
         return exit_status::Failed;
     }
-    std::printf("Imported %s as %s.\n", file.c_str(), wanted.empty() ? nedit::ToUtf8(name).c_str() : wanted.c_str());
+    std::printf("Imported %s as %s.\n", file.c_str(),
+                wanted.empty() ? nedit::ToUtf8(name).c_str() : wanted.c_str());
     return exit_status::Ok;
 }
 
@@ -109,8 +114,8 @@ int Reduce(OpenJob& open, const std::vector<std::string>& args) {
     const int result = doc->SetupDataBase(&list);
     // Addition points went into the rows; they are kept with the document.
     doc->SaveDocument();
-    if (!WriteReductionOutput(*doc->GetDatabase(), doc->GetNReport(), report, json, open.host.Messages(),
-                              doc->GetSettings().GetLengthDecimals())) {
+    if (!WriteReductionOutput(*doc->GetDatabase(), doc->GetNReport(), report, json,
+                              open.host.Messages(), doc->GetSettings().GetLengthDecimals())) {
         return exit_status::Failed;
     }
     return result == 1 ? exit_status::Ok : exit_status::Failed;
@@ -144,7 +149,8 @@ int RunDoc(const std::vector<std::string>& args) {
     const std::string& command = args[0];
     const std::vector<std::string> rest(args.begin() + 1, args.end());
     const std::size_t count = rest.size();
-    const bool known = (command == "list" && count == 1) || (command == "import" && (count == 2 || count == 4)) ||
+    const bool known = (command == "list" && count == 1) ||
+                       (command == "import" && (count == 2 || count == 4)) ||
                        (command == "export" && count == 3) || (command == "reduce" && count >= 2) ||
                        (command == "rename" && count == 3) || (command == "delete" && count == 2);
     if (!known || (command == "import" && count == 4 && rest[2] != "--name")) {

@@ -9,10 +9,10 @@
 #include "PointOutput.h"
 #include "platform/io/LineReader.h"
 #include "platform/job/Csv.h"
-#include "platform/settings/DataDirectory.h"
 #include "platform/job/UDBPoint.h"
 #include "platform/job/UDBSQLiteTransaction.h"
 #include "platform/job/USurveyDoc.h"
+#include "platform/settings/DataDirectory.h"
 #include "platform/text/Format.h"
 #include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
@@ -131,10 +131,11 @@ int New(const std::string& path) {
 // The job's points, in the order they were stored.
 std::vector<PointRow> JobPoints(USurveyDoc& job) {
     std::vector<PointRow> points;
-    auto query = job.Database().Query("SELECT name, east, north, height, code FROM point ORDER BY id");
+    auto query =
+        job.Database().Query("SELECT name, east, north, height, code FROM point ORDER BY id");
     while (query->Step()) {
-        points.push_back({query->Text(0), query->Real(1), query->Real(2), !query->IsNull(3), query->Real(3),
-                          query->Text(4)});
+        points.push_back({query->Text(0), query->Real(1), query->Real(2), !query->IsNull(3),
+                          query->Real(3), query->Text(4)});
     }
     return points;
 }
@@ -144,8 +145,8 @@ int Points(const std::string& path, bool json) {
     options.access = nedit::JobAccess::ReadOnly;
     auto job = USurveyDoc::OpenJob(path, options);
     const std::vector<PointRow> points = JobPoints(*job);
-    const std::string out =
-        json ? PointsJson(points, 0) + "\n" : PointsTable(points, job->GetSettings().GetLengthDecimals());
+    const std::string out = json ? PointsJson(points, 0) + "\n"
+                                 : PointsTable(points, job->GetSettings().GetLengthDecimals());
     std::fwrite(out.data(), 1, out.size(), stdout);
     return std::fflush(stdout) == 0 ? exit_status::Ok : exit_status::Failed;
 }

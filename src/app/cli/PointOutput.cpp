@@ -10,12 +10,14 @@
 #include "platform/text/WideText.h"
 
 std::string PointsTable(const std::vector<PointRow>& points, int decimals) {
-    std::string out = nedit::ToUtf8(nedit::Format(L"%-12s %14s %14s %10s  %s\n", L"Name", L"East", L"North",
-                                                  L"Height", L"Code"));
+    std::string out = nedit::ToUtf8(nedit::Format(L"%-12s %14s %14s %10s  %s\n", L"Name", L"East",
+                                                  L"North", L"Height", L"Code"));
     for (const PointRow& point : points) {
-        const std::wstring height = point.hasHeight ? nedit::Format(L"%.*f", decimals, point.height) : L"-";
-        out += nedit::ToUtf8(nedit::TrimRight(nedit::Format(L"%-12s %14.*f %14.*f %10s  %s", point.name, decimals,
-                                                            point.east, decimals, point.north, height, point.code)));
+        const std::wstring height =
+            point.hasHeight ? nedit::Format(L"%.*f", decimals, point.height) : L"-";
+        out += nedit::ToUtf8(
+            nedit::TrimRight(nedit::Format(L"%-12s %14.*f %14.*f %10s  %s", point.name, decimals,
+                                           point.east, decimals, point.north, height, point.code)));
         out += '\n';
     }
     return out;
@@ -27,8 +29,8 @@ std::string PointsJson(const std::vector<PointRow>& points, int indent) {
     std::string out = "[";
     const char* separator = "\n";
     for (const PointRow& point : points) {
-        out += separator + margin + "  {\"id\": " + json::Quote(point.name) + ", \"e\": " + json::Number(point.east) +
-               ", \"n\": " + json::Number(point.north) +
+        out += separator + margin + "  {\"id\": " + json::Quote(point.name) +
+               ", \"e\": " + json::Number(point.east) + ", \"n\": " + json::Number(point.north) +
                ", \"h\": " + (point.hasHeight ? json::Number(point.height) : "null") +
                ", \"code\": " + json::Quote(point.code) + "}";
         separator = ",\n";
@@ -39,7 +41,8 @@ std::string PointsJson(const std::vector<PointRow>& points, int indent) {
 std::string PointsCsv(const std::vector<PointRow>& points) {
     std::string out = "name,east,north,height,code\n";
     for (const PointRow& point : points) {
-        out += nedit::CsvField(nedit::ToUtf8(point.name)) + "," + nedit::ToUtf8(nedit::DoubleToText(point.east)) + "," +
+        out += nedit::CsvField(nedit::ToUtf8(point.name)) + "," +
+               nedit::ToUtf8(nedit::DoubleToText(point.east)) + "," +
                nedit::ToUtf8(nedit::DoubleToText(point.north)) + "," +
                (point.hasHeight ? nedit::ToUtf8(nedit::DoubleToText(point.height)) : "") + "," +
                nedit::CsvField(nedit::ToUtf8(point.code)) + "\n";

@@ -8,8 +8,8 @@
 
 #include "Commands.h"
 #include "PointOutput.h"
-#include "ReductionOutput.h"
 #include "RecordSession.h"
+#include "ReductionOutput.h"
 #include "platform/job/JobError.h"
 #include "platform/job/USurveyDoc.h"
 #include "platform/text/WideText.h"
@@ -66,9 +66,11 @@ bool ParseOptions(const std::vector<std::string>& args, ReduceOptions& options) 
             options.points_csv = args[++i];
         } else if (arg == "--report" && has_value) {
             options.report = args[++i];
-        } else if (arg == "--angles" && has_value && (options.angles = Choice(args[i + 1], {"dms", "deg", "gon"})) >= 0) {
+        } else if (arg == "--angles" && has_value &&
+                   (options.angles = Choice(args[i + 1], {"dms", "deg", "gon"})) >= 0) {
             ++i;
-        } else if (arg == "--lengths" && has_value && (options.lengths = Choice(args[i + 1], {"m", "ft", "usft"})) >= 0) {
+        } else if (arg == "--lengths" && has_value &&
+                   (options.lengths = Choice(args[i + 1], {"m", "ft", "usft"})) >= 0) {
             ++i;
         } else if (arg == "--columns" && has_value && ValidColumns(args[i + 1])) {
             options.columns = args[++i];
@@ -76,7 +78,8 @@ bool ParseOptions(const std::vector<std::string>& args, ReduceOptions& options) 
         } else if (!arg.empty() && arg[0] != '-' && options.file.empty()) {
             options.file = arg;
         } else {
-            std::fprintf(stderr, "sxnedit: reduce: unexpected '%s' (see sxnedit --help)\n", arg.c_str());
+            std::fprintf(stderr, "sxnedit: reduce: unexpected '%s' (see sxnedit --help)\n",
+                         arg.c_str());
             return false;
         }
     }
@@ -120,7 +123,8 @@ int RunReduce(const std::vector<std::string>& args) {
         return exit_status::Unreadable;
     }
     const int result = engine.Process();
-    if (!WriteReductionOutput(engine, session.report.get(), options.report, options.json, session.host.Messages(),
+    if (!WriteReductionOutput(engine, session.report.get(), options.report, options.json,
+                              session.host.Messages(),
                               session.doc->GetSettings().GetLengthDecimals())) {
         return exit_status::Failed;
     }

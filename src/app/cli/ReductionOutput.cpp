@@ -11,17 +11,20 @@ std::vector<PointRow> ReducedPoints(const UNeditDatabase& engine) {
     std::vector<PointRow> points;
     points.reserve(engine.GetPointList().size());
     for (const UNeditPt& point : engine.GetPointList()) {
-        points.push_back({point.GetID(), point.x, point.y, point.z > kNoHeight, point.z, point.GetCode()});
+        points.push_back(
+            {point.GetID(), point.x, point.y, point.z > kNoHeight, point.z, point.GetCode()});
     }
     return points;
 }
 
 void PrintJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages) {
-    std::string out = "{\n  \"points\": " + PointsJson(ReducedPoints(engine), 2) + ",\n  \"lines\": [";
+    std::string out =
+        "{\n  \"points\": " + PointsJson(ReducedPoints(engine), 2) + ",\n  \"lines\": [";
     const char* separator = "\n    ";
     for (const UNeditLine& line : engine.GetLineList()) {
         out += separator;
-        out += "{\"from\": " + json::Quote(line.GetFromPt()) + ", \"to\": " + json::Quote(line.GetToPt()) +
+        out += "{\"from\": " + json::Quote(line.GetFromPt()) +
+               ", \"to\": " + json::Quote(line.GetToPt()) +
                ", \"station_line\": " + (line.GetStationLine() ? "true" : "false") + "}";
         separator = ",\n    ";
     }
@@ -29,15 +32,18 @@ void PrintJson(const UNeditDatabase& engine, const std::vector<std::wstring>& me
     separator = "\n    ";
     for (const UNeditArc& arc : engine.GetArcList()) {
         out += separator;
-        out += "{\"start\": " + json::Quote(arc.GetStartPt()) + ", \"end\": " + json::Quote(arc.GetEndPt()) +
-               ", \"third\": " + json::Quote(arc.GetThirdPt()) + ", \"type\": " + std::to_string(arc.GetArcType()) + "}";
+        out += "{\"start\": " + json::Quote(arc.GetStartPt()) +
+               ", \"end\": " + json::Quote(arc.GetEndPt()) +
+               ", \"third\": " + json::Quote(arc.GetThirdPt()) +
+               ", \"type\": " + std::to_string(arc.GetArcType()) + "}";
         separator = ",\n    ";
     }
     out += "\n  ],\n  \"circles\": [";
     separator = "\n    ";
     for (const UWCircle& circle : engine.GetCircleList()) {
         out += separator;
-        out += "{\"e\": " + json::Number(circle.GetCentre().x) + ", \"n\": " + json::Number(circle.GetCentre().y) +
+        out += "{\"e\": " + json::Number(circle.GetCentre().x) +
+               ", \"n\": " + json::Number(circle.GetCentre().y) +
                ", \"radius\": " + json::Number(circle.GetRadius()) + "}";
         separator = ",\n    ";
     }
@@ -51,15 +57,15 @@ void PrintJson(const UNeditDatabase& engine, const std::vector<std::wstring>& me
     std::fputs(out.c_str(), stdout);
 }
 
-
 bool CheckOutputOptions(const std::string& reportPath, bool json) {
     if (!json || reportPath != "-") return true;
     std::fprintf(stderr, "sxnedit: --json and --report - both want standard output\n");
     return false;
 }
 
-bool WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report, const std::string& reportPath,
-                          bool json, const std::vector<std::wstring>& messages, int decimals) {
+bool WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report,
+                          const std::string& reportPath, bool json,
+                          const std::vector<std::wstring>& messages, int decimals) {
     if (report != nullptr && reportPath == "-") {
         std::string text = nedit::ToUtf8(report->GetText());
         if (!text.empty() && text.back() != '\n') text += '\n';

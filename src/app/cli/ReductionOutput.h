@@ -20,5 +20,6 @@ bool CheckOutputOptions(const std::string& reportPath, bool json);
 /// Writes what a reduction gives: the report to `reportPath` ("-" for standard output, empty
 /// for none), then the JSON, or the table of points unless the report took standard output.
 /// False, with a message, when the report file cannot be written.
-bool WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report, const std::string& reportPath,
-                          bool json, const std::vector<std::wstring>& messages, int decimals);
+bool WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report,
+                          const std::string& reportPath, bool json,
+                          const std::vector<std::wstring>& messages, int decimals);

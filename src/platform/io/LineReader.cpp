@@ -11,7 +11,8 @@ namespace {
 constexpr std::size_t kBlockSize = 1 << 16;
 }
 
-LineReader::LineReader(std::size_t max_line_bytes) : max_line_bytes_(max_line_bytes), buffer_(kBlockSize) {}
+LineReader::LineReader(std::size_t max_line_bytes)
+    : max_line_bytes_(max_line_bytes), buffer_(kBlockSize) {}
 
 LineReader::~LineReader() {
     if (file_ != nullptr) std::fclose(file_);
@@ -45,7 +46,8 @@ bool LineReader::ReadLine(std::string& line) {
         if (begin_ == end_ && !Fill()) return any;
         if (at_start_) {
             at_start_ = false;
-            if (end_ - begin_ >= 3 && std::memcmp(buffer_.data() + begin_, "\xEF\xBB\xBF", 3) == 0) {
+            if (end_ - begin_ >= 3 &&
+                std::memcmp(buffer_.data() + begin_, "\xEF\xBB\xBF", 3) == 0) {
                 begin_ += 3;
                 consumed_ += 3;
                 if (begin_ == end_) continue;

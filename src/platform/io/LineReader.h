@@ -11,7 +11,7 @@
 namespace nedit {
 
 class LineReader {
-public:
+  public:
     explicit LineReader(std::size_t max_line_bytes = 64 * 1024);
     ~LineReader();
     LineReader(const LineReader&) = delete;
@@ -19,14 +19,14 @@ public:
 
     /// Opens the file at a UTF-8 path; false when it cannot be opened for reading.
     bool Open(const std::string& path);
-    /// The next line without its line end; false at the end of the file or on a read error. A UTF-8 byte-order mark at the very start
-    /// of the file is dropped.
+    /// The next line without its line end; false at the end of the file or on a read error. A UTF-8
+    /// byte-order mark at the very start of the file is dropped.
     bool ReadLine(std::string& line);
     /// Bytes consumed so far and the size of the file, for progress.
     long long Position() const { return consumed_; }
     long long Size() const { return size_; }
 
-private:
+  private:
     bool Fill();
 
     std::FILE* file_ = nullptr;

@@ -36,5 +36,4 @@ bool ReplaceFile(const std::string& target, const std::string& bytes) {
     return ok;
 }
 
-
 }  // namespace nedit

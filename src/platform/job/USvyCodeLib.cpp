@@ -1,11 +1,10 @@
 #include "platform/job/USvyCodeLib.h"
 
-#include "platform/io/ReplaceFile.h"
-
 #include <cstdio>
 #include <fstream>
 
 #include "platform/io/LineReader.h"
+#include "platform/io/ReplaceFile.h"
 #include "platform/job/Csv.h"
 #include "platform/job/JobDatabase.h"
 #include "platform/job/UDBSQLiteTransaction.h"
@@ -169,7 +168,8 @@ bool USvyCodeLib::LoadFile(const std::string& path, std::wstring& error) {
 
 bool USvyCodeLib::SaveFile(const std::string& path, std::wstring& error) const {
     std::string text;
-    for (const auto& column : TextColumns()) text += std::string(text.empty() ? "" : ",") + column.first;
+    for (const auto& column : TextColumns())
+        text += std::string(text.empty() ? "" : ",") + column.first;
     for (const auto& column : IntColumns()) text += std::string(",") + column.first;
     text += '\n';
     for (const USvyCode& code : codes_) {

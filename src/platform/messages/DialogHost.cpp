@@ -4,8 +4,8 @@ namespace nedit {
 
 int mb::DefaultAnswer(unsigned flags) {
     static const int kButtons[6][3] = {
-        {IdOk, IdOk, IdOk},          {IdOk, IdCancel, IdCancel},  {IdAbort, IdRetry, IdIgnore},
-        {IdYes, IdNo, IdCancel},     {IdYes, IdNo, IdNo},         {IdRetry, IdCancel, IdCancel},
+        {IdOk, IdOk, IdOk},      {IdOk, IdCancel, IdCancel}, {IdAbort, IdRetry, IdIgnore},
+        {IdYes, IdNo, IdCancel}, {IdYes, IdNo, IdNo},        {IdRetry, IdCancel, IdCancel},
     };
     const unsigned buttons = flags & ButtonsMask;
     const unsigned which = (flags & DefButtonMask) >> 8;

@@ -41,7 +41,7 @@ int DefaultAnswer(unsigned flags);
 /// The logic of one modal dialog: its members, defaults and handlers. A host shows it and
 /// reports how it ended; everything else is tested without a screen.
 class UDialogLogic {
-public:
+  public:
     virtual ~UDialogLogic();
     /// A stable name by which hosts and test scripts recognise the dialog.
     virtual std::wstring DialogName() const = 0;
@@ -53,7 +53,7 @@ public:
 };
 
 class DialogHost {
-public:
+  public:
     virtual ~DialogHost();
     /// Shows an already translated message; gives the answer (mb::IdOk, mb::IdYes, ...).
     virtual int ShowMessage(const std::wstring& text, unsigned flags, unsigned help) = 0;

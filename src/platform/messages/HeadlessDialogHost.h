@@ -13,7 +13,7 @@
 namespace nedit {
 
 class HeadlessDialogHost : public DialogHost {
-public:
+  public:
     struct Message {
         std::wstring text;
         unsigned flags;
@@ -34,7 +34,7 @@ public:
     /// The dialogs run so far, by name, in order.
     const std::vector<std::wstring>& DialogsRun() const { return dialogs_run_; }
 
-private:
+  private:
     std::deque<int> answers_;
     std::map<std::wstring, DialogScript> scripts_;
     std::vector<Message> messages_;

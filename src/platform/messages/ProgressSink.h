@@ -7,7 +7,7 @@
 namespace nedit {
 
 class ProgressSink {
-public:
+  public:
     virtual ~ProgressSink() = default;
     /// `percent` from 0 to 100, with the text of the stage ("Generating Graphics").
     virtual void Update(int /*percent*/, const std::wstring& /*text*/) {}
@@ -16,7 +16,7 @@ public:
     void RequestAbort() { abort_requested_ = true; }
     void ClearAbort() { abort_requested_ = false; }
 
-private:
+  private:
     bool abort_requested_ = false;
 };
 

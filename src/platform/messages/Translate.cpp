@@ -11,7 +11,9 @@ void TranslationCatalogue::Set(const std::wstring& english, const std::wstring& 
     entries_[english] = translated;
 }
 
-void TranslationCatalogue::Clear() { entries_.clear(); }
+void TranslationCatalogue::Clear() {
+    entries_.clear();
+}
 
 const std::wstring& TranslationCatalogue::Lookup(const std::wstring& english) const {
     const auto found = entries_.find(english);
@@ -31,7 +33,8 @@ std::wstring FillPlaceholders(const std::wstring& text, std::initializer_list<st
                 index = index * 10 + static_cast<std::size_t>(text[j] - L'0');
                 ++j;
             }
-            if (j > i + 1 && j < text.size() && text[j] == L'}' && index >= 1 && index <= args.size()) {
+            if (j > i + 1 && j < text.size() && text[j] == L'}' && index >= 1 &&
+                index <= args.size()) {
                 out += *(args.begin() + (index - 1));
                 i = j + 1;
                 continue;

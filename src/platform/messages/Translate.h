@@ -11,7 +11,7 @@ namespace nedit {
 
 /// English text to translated text. Empty by default, so English stands.
 class TranslationCatalogue {
-public:
+  public:
     static TranslationCatalogue& Instance();
 
     void Set(const std::wstring& english, const std::wstring& translated);
@@ -19,7 +19,7 @@ public:
     /// The translation of `english`, or `english` itself when there is none.
     const std::wstring& Lookup(const std::wstring& english) const;
 
-private:
+  private:
     std::map<std::wstring, std::wstring> entries_;
 };
 

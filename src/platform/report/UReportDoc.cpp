@@ -11,7 +11,8 @@ void UReportDoc::NewLines(int count) {
     for (int i = 0; i < count; ++i) Text.emplace_back();
 }
 
-void UReportDoc::WriteText(const std::wstring& text, int linesBefore, int linesAfter, int /*unused*/) {
+void UReportDoc::WriteText(const std::wstring& text, int linesBefore, int linesAfter,
+                           int /*unused*/) {
     NewLines(linesBefore);
     Text.back() += text;
     NewLines(linesAfter);
@@ -43,4 +44,6 @@ std::wstring UReportDoc::GetText() const {
     return out;
 }
 
-bool UReportDoc::SaveAsText(const std::string& path) const { return nedit::ReplaceFile(path, nedit::ToUtf8(GetText())); }
+bool UReportDoc::SaveAsText(const std::string& path) const {
+    return nedit::ReplaceFile(path, nedit::ToUtf8(GetText()));
+}

@@ -6,7 +6,7 @@
 #include <vector>
 
 class UReportDoc {
-public:
+  public:
     /// Lines per page when none is set: a printed A4 or letter page at six lines an inch.
     static constexpr int kDefaultPageLength = 66;
 
@@ -36,7 +36,7 @@ public:
     /// Writes GetText to a file (UTF-8); false when it cannot be written.
     bool SaveAsText(const std::string& path) const;
 
-private:
+  private:
     int LinesOnPage() const { return static_cast<int>(Text.size()) - 1 - PageStart; }
 
     std::wstring Title;

@@ -1,7 +1,5 @@
 #include "platform/settings/IniFile.h"
 
-#include "platform/io/ReplaceFile.h"
-
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -11,6 +9,7 @@
 #include <filesystem>
 #include <vector>
 
+#include "platform/io/ReplaceFile.h"
 #include "platform/text/WideText.h"
 
 namespace nedit {

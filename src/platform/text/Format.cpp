@@ -15,7 +15,7 @@ namespace {
 
 // Number formatting runs under the C locale of this thread for the length of one call.
 class CNumericLocale {
-public:
+  public:
     CNumericLocale() {
         static const locale_t c_locale = newlocale(LC_ALL_MASK, "C", nullptr);
         previous_ = uselocale(c_locale);
@@ -24,7 +24,7 @@ public:
     CNumericLocale(const CNumericLocale&) = delete;
     CNumericLocale& operator=(const CNumericLocale&) = delete;
 
-private:
+  private:
     locale_t previous_;
 };
 
@@ -35,14 +35,16 @@ struct Spec {
     wchar_t conversion = 0;
 };
 
-bool IsFlag(wchar_t c) { return c == L'-' || c == L'+' || c == L' ' || c == L'0' || c == L'#'; }
+bool IsFlag(wchar_t c) {
+    return c == L'-' || c == L'+' || c == L' ' || c == L'0' || c == L'#';
+}
 bool IsLengthModifier(wchar_t c) {
     return c == L'h' || c == L'l' || c == L'L' || c == L'z' || c == L'j' || c == L't' ||
            c == L'q' || c == L'I';
 }
 
 class Formatter {
-public:
+  public:
     Formatter(std::wstring_view format, std::initializer_list<FormatArg> args)
         : format_(format), args_(args) {}
 
@@ -64,7 +66,7 @@ public:
         return out;
     }
 
-private:
+  private:
     const FormatArg* NextArg() {
         if (next_ >= args_.size()) return nullptr;
         return args_.begin() + next_++;
@@ -125,12 +127,13 @@ private:
         narrow += conversion;
         std::vector<char> buffer(64 + static_cast<std::size_t>(std::max(spec.width, 0)) +
                                  static_cast<std::size_t>(std::max(spec.precision, 0)) + 320);
-        const int written = is_real ? std::snprintf(buffer.data(), buffer.size(), narrow.c_str(), real)
-                                    : std::snprintf(buffer.data(), buffer.size(), narrow.c_str(), integer);
+        const int written =
+            is_real ? std::snprintf(buffer.data(), buffer.size(), narrow.c_str(), real)
+                    : std::snprintf(buffer.data(), buffer.size(), narrow.c_str(), integer);
         if (written < 0) return {};
-        return std::wstring(buffer.data(), buffer.data() + std::min<std::size_t>(
-                                                              static_cast<std::size_t>(written),
-                                                              buffer.size() - 1));
+        return std::wstring(buffer.data(),
+                            buffer.data() + std::min<std::size_t>(static_cast<std::size_t>(written),
+                                                                  buffer.size() - 1));
     }
 
     std::wstring Convert(const Spec& spec) {
@@ -144,14 +147,16 @@ private:
                 return Pad(std::move(text), spec);
             }
             case L'c':
-                return Pad(std::wstring(1, arg ? static_cast<wchar_t>(arg->AsInteger()) : L' '), spec);
+                return Pad(std::wstring(1, arg ? static_cast<wchar_t>(arg->AsInteger()) : L' '),
+                           spec);
             case L'd':
             case L'i':
             case L'u':
             case L'x':
             case L'X':
             case L'o': {
-                const char conversion = spec.conversion == L'i' ? 'd' : static_cast<char>(spec.conversion);
+                const char conversion =
+                    spec.conversion == L'i' ? 'd' : static_cast<char>(spec.conversion);
                 return PrintNumber(spec, "ll", conversion, arg ? arg->AsInteger() : 0, 0.0, false);
             }
             case L'f':
@@ -181,25 +186,34 @@ long long FormatArg::AsInteger() const {
             // Truncation as printf would see it, kept inside the range of the type.
             if (!std::isfinite(real_)) return 0;
             return static_cast<long long>(std::clamp(real_, -9.2e18, 9.2e18));
-        case Kind::Text: return TextToInt(text_);
-        default: return integer_;
+        case Kind::Text:
+            return TextToInt(text_);
+        default:
+            return integer_;
     }
 }
 
 double FormatArg::AsReal() const {
     switch (kind_) {
-        case Kind::Real: return real_;
-        case Kind::Text: return TextToDouble(text_);
-        default: return static_cast<double>(integer_);
+        case Kind::Real:
+            return real_;
+        case Kind::Text:
+            return TextToDouble(text_);
+        default:
+            return static_cast<double>(integer_);
     }
 }
 
 std::wstring FormatArg::AsText() const {
     switch (kind_) {
-        case Kind::Text: return std::wstring(text_);
-        case Kind::Character: return std::wstring(1, static_cast<wchar_t>(integer_));
-        case Kind::Real: return DoubleToText(real_);
-        default: return std::to_wstring(integer_);
+        case Kind::Text:
+            return std::wstring(text_);
+        case Kind::Character:
+            return std::wstring(1, static_cast<wchar_t>(integer_));
+        case Kind::Real:
+            return DoubleToText(real_);
+        default:
+            return std::to_wstring(integer_);
     }
 }
 

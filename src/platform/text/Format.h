@@ -11,7 +11,7 @@ namespace nedit {
 
 /// One argument of Format: a whole number, a real number, a character or text.
 class FormatArg {
-public:
+  public:
     enum class Kind { Integer, Real, Character, Text };
 
     FormatArg(int value) : kind_(Kind::Integer), integer_(value) {}
@@ -31,7 +31,7 @@ public:
     /// Numbers as the shortest text that reads back the same; a character as itself.
     std::wstring AsText() const;
 
-private:
+  private:
     Kind kind_;
     long long integer_ = 0;
     double real_ = 0.0;

@@ -19,13 +19,17 @@ int SequenceLength(unsigned char lead) {
     return 0;
 }
 
-bool IsContinuation(unsigned char byte) { return (byte & 0xC0) == 0x80; }
+bool IsContinuation(unsigned char byte) {
+    return (byte & 0xC0) == 0x80;
+}
 
 // Decodes one sequence at text[i]; gives the code point, or -1 if it is malformed.
 long DecodeAt(std::string_view text, std::size_t i, int length) {
     if (i + static_cast<std::size_t>(length) > text.size()) return -1;
     const auto lead = static_cast<unsigned char>(text[i]);
-    unsigned long code = length == 2 ? (lead & 0x1Fu) : length == 3 ? (lead & 0x0Fu) : (lead & 0x07u);
+    unsigned long code = length == 2   ? (lead & 0x1Fu)
+                         : length == 3 ? (lead & 0x0Fu)
+                                       : (lead & 0x07u);
     for (int k = 1; k < length; ++k) {
         const auto byte = static_cast<unsigned char>(text[i + static_cast<std::size_t>(k)]);
         if (!IsContinuation(byte)) return -1;
@@ -143,11 +147,15 @@ std::string ToUtf8(std::wstring_view text) {
 }
 
 std::wstring ToUpper(std::wstring_view text) {
-    return MapCase(text, towupper_l, [](wchar_t c) { return (c >= L'a' && c <= L'z') ? static_cast<wchar_t>(c - 32) : c; });
+    return MapCase(text, towupper_l, [](wchar_t c) {
+        return (c >= L'a' && c <= L'z') ? static_cast<wchar_t>(c - 32) : c;
+    });
 }
 
 std::wstring ToLower(std::wstring_view text) {
-    return MapCase(text, towlower_l, [](wchar_t c) { return (c >= L'A' && c <= L'Z') ? static_cast<wchar_t>(c + 32) : c; });
+    return MapCase(text, towlower_l, [](wchar_t c) {
+        return (c >= L'A' && c <= L'Z') ? static_cast<wchar_t>(c + 32) : c;
+    });
 }
 
 bool EqualsIgnoreCase(std::wstring_view a, std::wstring_view b) {
@@ -155,8 +163,10 @@ bool EqualsIgnoreCase(std::wstring_view a, std::wstring_view b) {
     const locale_t locale = CaseLocale();
     for (std::size_t i = 0; i < a.size(); ++i) {
         if (a[i] == b[i]) continue;
-        const wint_t upper_a = locale ? towupper_l(static_cast<wint_t>(a[i]), locale) : static_cast<wint_t>(a[i]);
-        const wint_t upper_b = locale ? towupper_l(static_cast<wint_t>(b[i]), locale) : static_cast<wint_t>(b[i]);
+        const wint_t upper_a =
+            locale ? towupper_l(static_cast<wint_t>(a[i]), locale) : static_cast<wint_t>(a[i]);
+        const wint_t upper_b =
+            locale ? towupper_l(static_cast<wint_t>(b[i]), locale) : static_cast<wint_t>(b[i]);
         if (upper_a != upper_b) return false;
     }
     return true;
@@ -178,11 +188,19 @@ std::wstring_view TrimRightView(std::wstring_view text) {
     return text.substr(0, end);
 }
 
-std::wstring_view TrimView(std::wstring_view text) { return TrimRightView(TrimLeftView(text)); }
+std::wstring_view TrimView(std::wstring_view text) {
+    return TrimRightView(TrimLeftView(text));
+}
 
-std::wstring TrimLeft(std::wstring_view text) { return std::wstring(TrimLeftView(text)); }
-std::wstring TrimRight(std::wstring_view text) { return std::wstring(TrimRightView(text)); }
-std::wstring Trim(std::wstring_view text) { return std::wstring(TrimView(text)); }
+std::wstring TrimLeft(std::wstring_view text) {
+    return std::wstring(TrimLeftView(text));
+}
+std::wstring TrimRight(std::wstring_view text) {
+    return std::wstring(TrimRightView(text));
+}
+std::wstring Trim(std::wstring_view text) {
+    return std::wstring(TrimView(text));
+}
 
 std::wstring TrimChars(std::wstring_view text, std::wstring_view chars) {
     const std::size_t start = text.find_first_not_of(chars);

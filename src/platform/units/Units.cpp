@@ -6,17 +6,31 @@ namespace nedit {
 
 LengthUnit LengthUnitFromLetter(wchar_t letter) {
     switch (letter) {
-        case L'F': case L'f': case L'1': return LengthUnit::Feet;
-        case L'U': case L'u': case L'2': return LengthUnit::USFeet;
-        default: return LengthUnit::Metres;
+        case L'F':
+        case L'f':
+        case L'1':
+            return LengthUnit::Feet;
+        case L'U':
+        case L'u':
+        case L'2':
+            return LengthUnit::USFeet;
+        default:
+            return LengthUnit::Metres;
     }
 }
 
 AngleUnit AngleUnitFromLetter(wchar_t letter) {
     switch (letter) {
-        case L'D': case L'd': case L'1': return AngleUnit::Degrees;
-        case L'G': case L'g': case L'2': return AngleUnit::Gons;
-        default: return AngleUnit::DegMinSec;
+        case L'D':
+        case L'd':
+        case L'1':
+            return AngleUnit::Degrees;
+        case L'G':
+        case L'g':
+        case L'2':
+            return AngleUnit::Gons;
+        default:
+            return AngleUnit::DegMinSec;
     }
 }
 
@@ -28,30 +42,43 @@ AngleUnit AngleUnitFromIndex(int index) {
     return index >= 0 && index <= 2 ? static_cast<AngleUnit>(index) : AngleUnit::DegMinSec;
 }
 
-int IndexOf(LengthUnit unit) { return static_cast<int>(unit); }
-int IndexOf(AngleUnit unit) { return static_cast<int>(unit); }
+int IndexOf(LengthUnit unit) {
+    return static_cast<int>(unit);
+}
+int IndexOf(AngleUnit unit) {
+    return static_cast<int>(unit);
+}
 
 wchar_t LetterOf(LengthUnit unit) {
     switch (unit) {
-        case LengthUnit::Feet: return L'F';
-        case LengthUnit::USFeet: return L'U';
-        default: return L'M';
+        case LengthUnit::Feet:
+            return L'F';
+        case LengthUnit::USFeet:
+            return L'U';
+        default:
+            return L'M';
     }
 }
 
 wchar_t LetterOf(AngleUnit unit) {
     switch (unit) {
-        case AngleUnit::Degrees: return L'D';
-        case AngleUnit::Gons: return L'G';
-        default: return L'S';
+        case AngleUnit::Degrees:
+            return L'D';
+        case AngleUnit::Gons:
+            return L'G';
+        default:
+            return L'S';
     }
 }
 
 double MetresPer(LengthUnit unit) {
     switch (unit) {
-        case LengthUnit::Feet: return 0.3048;
-        case LengthUnit::USFeet: return 1200.0 / 3937.0;
-        default: return 1.0;
+        case LengthUnit::Feet:
+            return 0.3048;
+        case LengthUnit::USFeet:
+            return 1200.0 / 3937.0;
+        default:
+            return 1.0;
     }
 }
 
@@ -86,17 +113,23 @@ double DegreesToDms(double degrees) {
 
 double ToDegrees(double value, AngleUnit unit) {
     switch (unit) {
-        case AngleUnit::Degrees: return value;
-        case AngleUnit::Gons: return value * 0.9;
-        default: return DmsToDegrees(value);
+        case AngleUnit::Degrees:
+            return value;
+        case AngleUnit::Gons:
+            return value * 0.9;
+        default:
+            return DmsToDegrees(value);
     }
 }
 
 double FromDegrees(double degrees, AngleUnit unit) {
     switch (unit) {
-        case AngleUnit::Degrees: return degrees;
-        case AngleUnit::Gons: return degrees / 0.9;
-        default: return DegreesToDms(degrees);
+        case AngleUnit::Degrees:
+            return degrees;
+        case AngleUnit::Gons:
+            return degrees / 0.9;
+        default:
+            return DegreesToDms(degrees);
     }
 }
 

@@ -1,11 +1,11 @@
-#include "platform/io/LineReader.h"
-
 #include <gtest/gtest.h>
 
 #include <cstdio>
 #include <fstream>
 #include <string>
 #include <vector>
+
+#include "platform/io/LineReader.h"
 
 using nedit::LineReader;
 
@@ -28,7 +28,9 @@ std::vector<std::string> ReadAll(const std::string& path, std::size_t max_line =
 }  // namespace
 
 TEST(LineReader, EveryKindOfLineEndAndTheByteOrderMark) {
-    const auto lines = ReadAll(WriteTemp("ends.txt", "\xEF\xBB\xBF" "a\r\nb\rc\n\nd"));
+    const auto lines = ReadAll(WriteTemp("ends.txt",
+                                         "\xEF\xBB\xBF"
+                                         "a\r\nb\rc\n\nd"));
     EXPECT_EQ(lines, (std::vector<std::string>{"a", "b", "c", "", "d"}));
     EXPECT_TRUE(ReadAll(WriteTemp("empty.txt", "")).empty());
     EXPECT_EQ(ReadAll(WriteTemp("bom.txt", "\xEF\xBB\xBF")).size(), 0u);

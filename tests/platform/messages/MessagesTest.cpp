@@ -28,7 +28,7 @@ TEST(DialogHost, DefaultButtonsFollowTheFlags) {
 
 namespace {
 class AskName : public UDialogLogic {
-public:
+  public:
     std::wstring DialogName() const override { return L"AskName"; }
     bool OnOK() override { return !name.empty(); }
     std::wstring name;

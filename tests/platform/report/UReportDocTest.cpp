@@ -1,6 +1,6 @@
-#include "platform/report/UReportDoc.h"
-
 #include <gtest/gtest.h>
+
+#include "platform/report/UReportDoc.h"
 
 TEST(UReportDoc, WritesLinesAndKeepsBlocksOnOnePage) {
     UReportDoc report(L"Reduction");

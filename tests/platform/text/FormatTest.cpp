@@ -1,5 +1,3 @@
-#include "platform/text/Format.h"
-
 #include <gtest/gtest.h>
 
 #include <clocale>
@@ -7,6 +5,7 @@
 #include <cstdlib>
 #include <string>
 
+#include "platform/text/Format.h"
 #include "platform/text/NumberText.h"
 
 using namespace nedit;
@@ -14,8 +13,8 @@ using namespace nedit;
 TEST(Format, TheSystemsRecordFormatsComeOutAsWritten) {
     EXPECT_EQ(Format(L"%-10s ID=%s,HI=0.000,CO= ", L"STN", std::wstring(L"P1")),
               L"STN        ID=P1,HI=0.000,CO= ");
-    EXPECT_EQ(Format(L"%-8s %s=%s,%s=%.3f,%s=%.3f,%s=%.3f", L"XYZ", L"ID", L"A", L"E", 1000.0,
-                     L"N", 2000.0004, L"H", -0.0005),
+    EXPECT_EQ(Format(L"%-8s %s=%s,%s=%.3f,%s=%.3f,%s=%.3f", L"XYZ", L"ID", L"A", L"E", 1000.0, L"N",
+                     2000.0004, L"H", -0.0005),
               L"XYZ      ID=A,E=1000.000,N=2000.000,H=-0.001");
     // A format made by a format, as the back-bearing record is built for the job's decimals.
     const std::wstring made = Format(L"%%-8s %%s=%%s,%%s=%%.%df,%%s=%%.%df", 4, 4);
@@ -26,7 +25,8 @@ TEST(Format, TheSystemsRecordFormatsComeOutAsWritten) {
 
 TEST(Format, WidthsCountCharactersAndEveryConversionWorks) {
     EXPECT_EQ(Format(L"[%5s][%-5s][%.2s]", L"\u00c9T", L"ab", L"xyz"), L"[   \u00c9T][ab   ][xy]");
-    EXPECT_EQ(Format(L"%d|%5d|%-4d|%03d|%x|%X|%o", 7, 42, 3, 5, 255, 255, 8), L"7|   42|3   |005|ff|FF|10");
+    EXPECT_EQ(Format(L"%d|%5d|%-4d|%03d|%x|%X|%o", 7, 42, 3, 5, 255, 255, 8),
+              L"7|   42|3   |005|ff|FF|10");
     EXPECT_EQ(Format(L"%.3f|%10.4f|%e|%g|%c|%%", 2.0, -1.5, 1500.0, 0.0001, L'Z'),
               L"2.000|   -1.5000|1.500000e+03|0.0001|Z|%");
     EXPECT_EQ(Format(L"%*d|%-*s|%.*f", 4, 1, 3, L"a", 2, 3.14159), L"   1|a  |3.14");

@@ -1,8 +1,8 @@
-#include "platform/text/NumberText.h"
-
 #include <gtest/gtest.h>
 
 #include <climits>
+
+#include "platform/text/NumberText.h"
 
 using namespace nedit;
 
@@ -12,10 +12,10 @@ TEST(NumberText, TextToDoubleReadsTheLeadingNumberOrGivesZero) {
         double expected;
     };
     const Case cases[] = {
-        {L"35.214", 35.214},  {L"  -2.5", -2.5},    {L"+7", 7.0},        {L"12.5M", 12.5},
-        {L"1.5e3", 1500.0},   {L".5", 0.5},         {L"", 0.0},          {L"ABC", 0.0},
-        {L"--3", 0.0},        {L"nan", 0.0},        {L"inf", 0.0},       {L"1e400", 0.0},
-        {L"1,5", 1.0},        {L"0.99960", 0.9996},
+        {L"35.214", 35.214}, {L"  -2.5", -2.5},    {L"+7", 7.0},  {L"12.5M", 12.5},
+        {L"1.5e3", 1500.0},  {L".5", 0.5},         {L"", 0.0},    {L"ABC", 0.0},
+        {L"--3", 0.0},       {L"nan", 0.0},        {L"inf", 0.0}, {L"1e400", 0.0},
+        {L"1,5", 1.0},       {L"0.99960", 0.9996},
     };
     for (const Case& c : cases) EXPECT_DOUBLE_EQ(TextToDouble(c.text), c.expected) << c.text;
 }

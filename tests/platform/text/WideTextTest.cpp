@@ -1,6 +1,6 @@
-#include "platform/text/WideText.h"
-
 #include <gtest/gtest.h>
+
+#include "platform/text/WideText.h"
 
 using namespace nedit;
 
@@ -9,7 +9,10 @@ TEST(WideText, Utf8RoundTripsAndMarksMalformedBytes) {
     EXPECT_EQ(FromUtf8(ToUtf8(text)), text);
     EXPECT_EQ(ToUtf8(L"\u00e9"), "\xC3\xA9");
     // A stray continuation byte, a truncated sequence, an overlong '/' and a surrogate.
-    EXPECT_EQ(FromUtf8("a\x80" "b"), L"a\uFFFD" L"b");
+    EXPECT_EQ(FromUtf8("a\x80"
+                       "b"),
+              L"a\uFFFD"
+              L"b");
     EXPECT_EQ(FromUtf8("\xC3"), L"\uFFFD");
     EXPECT_EQ(FromUtf8("\xC0\xAF"), L"\uFFFD\uFFFD");
     EXPECT_EQ(FromUtf8("\xED\xA0\x80"), L"\uFFFD\uFFFD\uFFFD");

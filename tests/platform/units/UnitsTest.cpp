@@ -1,6 +1,6 @@
-#include "platform/units/Units.h"
-
 #include <gtest/gtest.h>
+
+#include "platform/units/Units.h"
 
 using namespace nedit;
 
@@ -28,7 +28,8 @@ TEST(Units, GonsAndDecimalDegrees) {
 TEST(Units, LengthsAndLetters) {
     EXPECT_NEAR(ConvertLength(100.0, LengthUnit::Feet, LengthUnit::Metres), 30.48, 1e-12);
     // The US survey foot is 1200/3937 m = 0.3048006096... m.
-    EXPECT_NEAR(ConvertLength(1000.0, LengthUnit::USFeet, LengthUnit::Metres), 304.8006096012, 1e-9);
+    EXPECT_NEAR(ConvertLength(1000.0, LengthUnit::USFeet, LengthUnit::Metres), 304.8006096012,
+                1e-9);
     EXPECT_NEAR(ConvertLength(30.48, LengthUnit::Metres, LengthUnit::Feet), 100.0, 1e-12);
     EXPECT_EQ(LengthUnitFromLetter(L'1'), LengthUnit::Feet);
     EXPECT_EQ(LengthUnitFromLetter(L'U'), LengthUnit::USFeet);
