@@ -3,13 +3,13 @@
 
 #include <fstream>
 
-#include "document/UListCtrl.h"
 #include "platform/geometry/UAngle.h"
 #include "platform/io/LineReader.h"
 #include "platform/text/Format.h"
 #include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
+#include "records/RowSource.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "reduction/UNeditDatabase.h"
 
@@ -205,11 +205,11 @@ int UNeditDatabase::GetPointFromPtList(const std::wstring& name, double& e, doub
     return mode == 1 && point.IsPTRecord() ? 0 : 1;
 }
 
-int UNeditDatabase::FindCoordinateRow(const std::wstring& name, bool coordinates, int type,
-                                      double* e, double* n, double* z) {
-    if (ListCtrl == nullptr || Doc == nullptr) return -1;
-    for (int row = 0; row < ListCtrl->GetItemCount(); ++row) {
-        const std::wstring text = nedit::ToUpper(nedit::TrimView(ListCtrl->GetItemText(row)));
+int UNeditDatabase::FindCoordinateRow(const nedit::RowSource* rows, const std::wstring& name,
+                                      bool coordinates, int type, double* e, double* n, double* z) {
+    if (rows == nullptr || Doc == nullptr) return -1;
+    for (int row = 0; row < rows->GetItemCount(); ++row) {
+        const std::wstring text = nedit::ToUpper(nedit::TrimView(rows->GetItemText(row)));
         const int row_type = Doc->GetRecordType(text);
         const bool wanted =
             coordinates ? (row_type == rec::Xyz || row_type == rec::Yxz) : row_type == type;
@@ -226,11 +226,16 @@ int UNeditDatabase::FindCoordinateRow(const std::wstring& name, bool coordinates
 }
 
 int UNeditDatabase::FindXYZ(const std::wstring& name, double& e, double& n, double& z) {
-    return FindCoordinateRow(name, true, rec::Xyz, &e, &n, &z);
+    return FindCoordinateRow(Rows, name, true, rec::Xyz, &e, &n, &z);
+}
+
+int UNeditDatabase::FindXYZ(const nedit::RowSource& rows, const std::wstring& name, double& e,
+                            double& n, double& z) {
+    return FindCoordinateRow(&rows, name, true, rec::Xyz, &e, &n, &z);
 }
 
 int UNeditDatabase::FindRecord(int type, const std::wstring& name) {
-    return FindCoordinateRow(name, false, type, nullptr, nullptr, nullptr);
+    return FindCoordinateRow(Rows, name, false, type, nullptr, nullptr, nullptr);
 }
 
 std::wstring UNeditDatabase::FormatXYZRecord(const std::wstring& name, double e, double n,

@@ -3,7 +3,6 @@
 
 #include <cmath>
 
-#include "document/UListCtrl.h"
 #include "platform/geometry/Tolerance.h"
 #include "platform/geometry/UAngle.h"
 #include "platform/geometry/UWLine.h"
@@ -12,6 +11,7 @@
 #include "platform/text/Format.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
+#include "records/RowSource.h"
 #include "reduction/UBKBCoordDlg.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "reduction/UNeditDatabase.h"
@@ -211,7 +211,7 @@ void UNeditDatabase::AskBackStation(const STNSTRUCT& station, StationWork& work,
     double e = 0.0, n = 0.0, z = 0.0;
     const int row = FindXYZ(station.BkStnName, e, n, z);
     if (row < 0) {
-        if (ListCtrl != nullptr) ListCtrl->AddRecord(ListCtrl->GetItemCount(), text);
+        if (Rows != nullptr) Rows->AddRecord(Rows->GetItemCount(), text);
     } else if (!Is_Zero(e - dialog.East, false) || !Is_Zero(n - dialog.North, false) ||
                !Is_Zero(z - dialog.Height, false)) {
         ReplaceRow(row, text);

@@ -5,12 +5,12 @@
 
 #include <cstdio>
 
-#include "document/UListCtrl.h"
 #include "platform/messages/DialogHost.h"
 #include "platform/messages/ProgressSink.h"
 #include "platform/messages/Translate.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
+#include "records/RowSource.h"
 
 namespace {
 
@@ -33,11 +33,11 @@ bool IsContentType(int type) {
 
 }  // namespace
 
-UNeditDatabase::UNeditDatabase(UNeutralFileFormat* format, UListCtrl* list, USurveyDoc* job,
+UNeditDatabase::UNeditDatabase(UNeutralFileFormat* format, nedit::RowSource* rows, USurveyDoc* job,
                                nedit::DialogHost* host, nedit::ProgressSink* progress,
                                const std::wstring& chkCode)
     : Doc(format),
-      ListCtrl(list),
+      Rows(rows),
       SurveyDoc(job),
       Host(host),
       Progress(progress),
@@ -153,11 +153,11 @@ void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRo
 
 std::vector<std::wstring> UNeditDatabase::ContentRows() const {
     std::vector<std::wstring> rows;
-    if (ListCtrl == nullptr || Doc == nullptr) return rows;
-    rows.reserve(static_cast<std::size_t>(ListCtrl->GetItemCount()));
-    for (int row = 0; row < ListCtrl->GetItemCount(); ++row) {
-        std::wstring text = nedit::ToUpper(nedit::TrimView(
-            std::wstring_view(ListCtrl->GetItemText(row)).substr(0, kMaxRowLength)));
+    if (Rows == nullptr || Doc == nullptr) return rows;
+    rows.reserve(static_cast<std::size_t>(Rows->GetItemCount()));
+    for (int row = 0; row < Rows->GetItemCount(); ++row) {
+        std::wstring text = nedit::ToUpper(
+            nedit::TrimView(std::wstring_view(Rows->GetItemText(row)).substr(0, kMaxRowLength)));
         if (IsContentType(Doc->GetRecordType(text))) rows.push_back(std::move(text));
     }
     return rows;
@@ -168,7 +168,7 @@ void UNeditDatabase::CreateContent() {
 }
 
 bool UNeditDatabase::IsContentModified() const {
-    if (ListCtrl == nullptr || Doc == nullptr) return false;
+    if (Rows == nullptr || Doc == nullptr) return false;
     const std::vector<std::wstring> present = ContentRows();
     if (present.size() != ContentLines.size()) return true;
     FieldMap stored_fields;
@@ -192,7 +192,7 @@ bool UNeditDatabase::IsContentModified() const {
 }
 
 void UNeditDatabase::ReplaceRow(int row, const std::wstring& text) {
-    if (ListCtrl == nullptr) return;
-    ListCtrl->DeleteItem(row);
-    ListCtrl->AddRecord(row, text);
+    if (Rows == nullptr) return;
+    Rows->DeleteItem(row);
+    Rows->AddRecord(row, text);
 }

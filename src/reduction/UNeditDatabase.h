@@ -22,13 +22,13 @@
 #include "reduction/NameIndex.h"
 #include "reduction/ObservationModel.h"
 
-class UListCtrl;
 class UNeditReport;
 class USurveyDoc;
 
 namespace nedit {
 class DialogHost;
 class ProgressSink;
+class RowSource;
 }  // namespace nedit
 
 /// Coordinates of a point given by an Xyz record.
@@ -44,9 +44,9 @@ extern double CurInstHt;
 
 class UNeditDatabase {
   public:
-    /// The engine of a document: its format service, record list, job and dialog host, each
-    /// of which may be null. `chkCode` is the check code, "*CHK" when empty.
-    UNeditDatabase(UNeutralFileFormat* format, UListCtrl* list, USurveyDoc* job,
+    /// The engine of a document: its format service, rows (the record list), job and dialog
+    /// host, each of which may be null. `chkCode` is the check code, "*CHK" when empty.
+    UNeditDatabase(UNeutralFileFormat* format, nedit::RowSource* rows, USurveyDoc* job,
                    nedit::DialogHost* host, nedit::ProgressSink* progress = nullptr,
                    const std::wstring& chkCode = L"");
     virtual ~UNeditDatabase();
@@ -72,7 +72,7 @@ class UNeditDatabase {
 
     void SetOutput(bool output) { Output = output; }
     bool GetOutput() const { return Output; }
-    void SetListCtrlPtr(UListCtrl* list) { ListCtrl = list; }
+    void SetListCtrlPtr(nedit::RowSource* rows) { Rows = rows; }
     void SetReportPtr(UNeditReport* report) { Report = report; }
     UNeditReport* GetReport() const { return Report; }
     void SetFileName(const std::wstring& name) { FileName = name; }
@@ -82,8 +82,8 @@ class UNeditDatabase {
     /// The extents of the last run's points, or of the last good run.
     UWRect GetDocExtents() const { return DocRect; }
 
-    /// Reads a neutral text file (UTF-8 path) into the record list, clearing it first.
-    /// Gives 1 when the list holds at least one row afterwards, else 0. Shows
+    /// Reads a neutral text file (UTF-8 path) into the rows, clearing them first.
+    /// Gives 1 when there is at least one row afterwards, else 0. Shows
     /// "Failed to open {1}." or "Neutral file header not found." when it cannot read.
     int LoadNeFile(const std::wstring& path);
     /// The angle type of the current angular unit letter: 1 decimal degrees, 2 gons, else 0.
@@ -128,7 +128,6 @@ class UNeditDatabase {
     wchar_t GetVMode() const { return VMode; }
     wchar_t GetAngleUnit() const { return AngleUnit; }
     wchar_t GetLengthUnit() const { return LengthUnit; }
-    UListCtrl* GetListCtrl() const { return ListCtrl; }
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
     void SetCurHMode(wchar_t mode) { HMode = mode; }
     void SetTravFlag(int flag) { TravFlag = flag; }
@@ -163,7 +162,12 @@ class UNeditDatabase {
     bool CoordsOrderXY() const;
     int GetPointFromPtList(const std::wstring& name, double& e, double& n, double& z,
                            std::wstring& code, unsigned mode) const;
+    /// The first Xyz or Yxz row of that name in the engine's rows, its values in `e`, `n`,
+    /// `z`; gives the row, or -1.
     int FindXYZ(const std::wstring& name, double& e, double& n, double& z);
+    /// The same in other rows.
+    int FindXYZ(const nedit::RowSource& rows, const std::wstring& name, double& e, double& n,
+                double& z);
     int FindRecord(int type, const std::wstring& name);
     std::wstring FormatXYZRecord(const std::wstring& name, double e, double n, double z) const;
     std::wstring FormatBKBRecord(const std::wstring& name, double reading, double bearing) const;
@@ -211,10 +215,10 @@ class UNeditDatabase {
     // ---- Derived points back into the rows --------------------------------------------
     /// Writes the adjusted points as XYZ rows behind the marker row, making the marker when
     /// there is none. 1 when rows were written.
-    int SaveAdjustedPt2CtrlList(UListCtrl* list);
+    int SaveAdjustedPt2CtrlList(nedit::RowSource* list);
     /// Writes the addition points (coordinates the user or the job gave) as XYZ rows in the
     /// file's unit above the marker, replacing a row of the same name whose values differ.
-    int SaveAdditionPt2CtrlList(UListCtrl* list);
+    int SaveAdditionPt2CtrlList(nedit::RowSource* list);
     /// Forgets the adjusted points and deletes the rows from the lowest marker down.
     void DelAdjPts();
     void ClearAddPtList();
@@ -242,8 +246,8 @@ class UNeditDatabase {
     void ProcessBkbRecord();
     void ProcessObservation(int type, int recordNo);
     void ApplyDistanceCorrection(MEASSTRUCT& measurement) const;
-    int FindCoordinateRow(const std::wstring& name, bool coordinates, int type, double* e,
-                          double* n, double* z);
+    int FindCoordinateRow(const nedit::RowSource* rows, const std::wstring& name, bool coordinates,
+                          int type, double* e, double* n, double* z);
     void ReplaceRow(int row, const std::wstring& text);
     /// The first node of that exact name, in list order; the others follow by NextSameName.
     STNSTRUCT* FirstNamed(const std::wstring& name) const;
@@ -273,7 +277,7 @@ class UNeditDatabase {
     // Collaborators.
     UNeutralFileFormat* Doc;
     UNeditReport* Report = nullptr;
-    UListCtrl* ListCtrl;
+    nedit::RowSource* Rows;
     USurveyDoc* SurveyDoc;
     nedit::DialogHost* Host;
     nedit::ProgressSink* Progress;

@@ -5,7 +5,7 @@
 #include <vector>
 
 #include "../records/RecordFixture.h"
-#include "document/UListCtrl.h"
+#include "../records/RowList.h"
 #include "platform/messages/HeadlessDialogHost.h"
 #include "reduction/UNeditDatabase.h"
 
@@ -38,7 +38,7 @@ class LoadNeFile : public RecordFixture {
         return texts;
     }
 
-    UListCtrl list{&format};
+    nedit::test::RowList list{&format};
     nedit::HeadlessDialogHost host;
     UNeditDatabase engine{&format, &list, nullptr, &host};
 };

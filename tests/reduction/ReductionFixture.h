@@ -7,7 +7,7 @@
 #include <string>
 
 #include "../records/RecordFixture.h"
-#include "document/UListCtrl.h"
+#include "../records/RowList.h"
 #include "platform/messages/HeadlessDialogHost.h"
 #include "reduction/UNeditDatabase.h"
 
@@ -38,7 +38,7 @@ class ReductionFixture : public RecordFixture {
         EXPECT_NEAR(point.z, h, tolerance) << "Height of " << std::string(name.begin(), name.end());
     }
 
-    UListCtrl list{&format};
+    nedit::test::RowList list{&format};
     nedit::HeadlessDialogHost host;
     UNeditDatabase engine{&format, &list, nullptr, &host};
 };
