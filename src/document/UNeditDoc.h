@@ -2,7 +2,7 @@
 // A raw-data document: one set of field observations inside a job. It is the record service
 // for its records, keeps their text in the "NeutralData" stream of its storage and its plan
 // settings in "Settings", owns the engine of its last reduction and the report, and holds the
-// report parameters.
+// report parameters: it is the report's context.
 //
 // Decisions:
 // - A stored stream whose first line is no neutral-file header is still read row by row:
@@ -22,6 +22,7 @@
 #include "records/UNeutralFileFormat.h"
 #include "report/NeditIni.h"
 #include "report/OutParamStruct.h"
+#include "report/ReportContext.h"
 
 class UListCtrl;
 class UNeditDatabase;
@@ -32,7 +33,7 @@ namespace nedit {
 class DialogHost;
 }
 
-class UNeditDoc : public UDocument, public UNeutralFileFormat {
+class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::ReportContext {
   public:
     static constexpr const wchar_t* kNeutralDataStream = L"NeutralData";
     static constexpr const wchar_t* kSettingsStream = L"Settings";
@@ -86,16 +87,20 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat {
     void ClearReport();
     int GetCheckOn(int id) const { return ::GetCheckOn(OutputParameters, id); }
     OutParamStruct& GetOutputParameters() { return OutputParameters; }
+    const OutParamStruct& GetOutputParameters() const override { return OutputParameters; }
     int GetPageSize() const { return OutputParameters.PageSize; }
     /// True when the job shows easting before northing.
-    bool IsENOrder() const { return Settings.GetCoordinateOrder() == UJobSettings::kEastNorth; }
+    bool IsENOrder() const override {
+        return Settings.GetCoordinateOrder() == UJobSettings::kEastNorth;
+    }
     /// Takes the job's settings again, its units as output units, and tells the report.
     void UpdateDisplaySettings();
 
     // ---- Plain access ---------------------------------------------------------------------------
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
     USurveyDoc* GetSurveyDocument() const override { return SurveyDoc; }
-    const UJobSettings& GetSettings() const { return Settings; }
+    const UJobSettings& GetSettings() const override { return Settings; }
+    const UNeutralFileFormat& GetRecordFormat() const override { return *this; }
     UNeditSettings& GetNeditSettings() { return NeditSettings; }
     const std::wstring& GetNeuText() const { return NeuText; }
     const std::wstring& GetNeuFileName() const { return NeuFileName; }

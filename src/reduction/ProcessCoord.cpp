@@ -3,6 +3,7 @@
 
 #include <cmath>
 
+#include "platform/geometry/CoordinateGeometry.h"
 #include "platform/geometry/Tolerance.h"
 #include "platform/geometry/UAngle.h"
 #include "platform/geometry/UWLine.h"
@@ -39,9 +40,7 @@ struct UNeditDatabase::StationWork {
 
 void UNeditDatabase::geo_coord(double e, double n, double bearing, double dist, double* eOut,
                                double* nOut) {
-    const double b = bearing * kRadiansPerDegree;
-    *eOut = std::sin(b) * dist + e;
-    *nOut = std::cos(b) * dist + n;
+    nedit::geo_coord(e, n, bearing, dist, eOut, nOut);
 }
 
 void UNeditDatabase::ApplyOffsets(double& e, double& n, double& z, double along, double right,
@@ -124,8 +123,7 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
             if (findCoord(station.BkStnName, be, bn, bz, back_code, report, true) &&
                 Report != nullptr) {
                 double distance = 0.0;
-                UNeditReport::geo_brgdst(work.StnE, work.StnN, be, bn, &work.BackBearing,
-                                         &distance);
+                nedit::geo_brgdst(work.StnE, work.StnN, be, bn, &work.BackBearing, &distance);
             }
         }
         const double stored = GetBearingFromArray(station.StnName, station.BkStnName);
@@ -356,10 +354,16 @@ void UNeditDatabase::PrintRunHead() {
 
 void UNeditDatabase::PrintStationBlock(const STNSTRUCT& station, const StationWork& work) {
     const bool bearing_mode = station.HMode == L'B';
-    Report->PrintOccStnBlk(
-        &station, station.StnName, work.StnE, work.StnN, work.StnZ, station.StnCode, station.HtInst,
-        GetStnScaleFactor(station.StnName), bearing_mode ? std::wstring() : station.BkStnName,
-        bearing_mode ? 0.0 : work.BackBearing, bearing_mode ? 0.0 : work.BsReading);
+    std::vector<double> back_readings;
+    if (!station.BSList.empty()) {
+        for (const MEASSTRUCT& measurement : *station.BSList.front()->Meas)
+            back_readings.push_back(measurement.HAng);
+    }
+    Report->PrintOccStnBlk(back_readings, station.StnName, work.StnE, work.StnN, work.StnZ,
+                           station.StnCode, station.HtInst, GetStnScaleFactor(station.StnName),
+                           bearing_mode ? std::wstring() : station.BkStnName,
+                           bearing_mode ? 0.0 : work.BackBearing,
+                           bearing_mode ? 0.0 : work.BsReading);
     if (!Is_Zero(station.Swing - FirstSwing, false))
         Report->PrintHeadHDegree(L"Swing", station.Swing, true);
 }
