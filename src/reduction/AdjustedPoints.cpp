@@ -68,8 +68,7 @@ int UNeditDatabase::SaveAdditionPt2CtrlList(nedit::RowSource* list) {
 
 void UNeditDatabase::DelAdjPts() {
     if (TravPtList.empty()) return;
-    TravPtList.clear();
-    TravPtIndex.Clear();
+    TravPtList.Clear();
     if (Rows == nullptr || Rows->GetItemCount() == 0) return;
     const int marker = FindMarker(*Rows);
     if (marker < 0) return;
@@ -77,6 +76,5 @@ void UNeditDatabase::DelAdjPts() {
 }
 
 void UNeditDatabase::ClearAddPtList() {
-    AddPtList.clear();
-    AddPtIndex.Clear();
+    AddPtList.Clear();
 }

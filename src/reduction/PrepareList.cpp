@@ -80,8 +80,7 @@ int UNeditDatabase::PrepareRows(const std::vector<std::wstring>& rows) {
     DeleteList();
     // Every row may name a station or a point: room for all of them up front spares the
     // name tables their rehashing as a large survey fills them.
-    PointIndex.Reserve(rows.size());
-    PointList.reserve(rows.size());
+    PointList.Reserve(rows.size());
     TravFlag = 0;
     const std::size_t count = rows.size();
     std::wstring normalised;
@@ -222,7 +221,7 @@ void UNeditDatabase::ProcessPtRecord() {
     const std::wstring id = OwnValue(fld::ID);
     if (id.empty()) return;
     SavePoint(id, Number(GetValue(fld::E)), Number(GetValue(fld::N)), Number(GetValue(fld::H)),
-              OwnValue(fld::CO), 1, 2, 0);
+              OwnValue(fld::CO), 1, kSaveFromPTRecord, 0);
     if (!CurPtNames) CurPtNames = std::make_unique<std::vector<std::wstring>>();
     if (CurPtNames->empty() || !nedit::EqualsIgnoreCase(CurPtNames->back(), id)) {
         CurPtNames->push_back(id);

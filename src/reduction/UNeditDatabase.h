@@ -3,7 +3,8 @@
 // targets and measurements, averages them, reduces them to East, North, Height, and keeps
 // the points, lines and arcs that result. Its operations live in the source files of the
 // stage they belong to: PrepareList.cpp, Averaging.cpp, CoordLookup.cpp, ProcessCoord.cpp,
-// the run in UNeditDatabase.cpp, the stores in codes/PointStores.cpp.
+// the run in UNeditDatabase.cpp. The stores of reduced geometry are classes of codes/
+// (PointStore, LineStore, ArcStore) which the engine owns and forwards to (EngineStores.cpp).
 
 #include <functional>
 #include <map>
@@ -12,14 +13,14 @@
 #include <unordered_map>
 #include <vector>
 
-#include "codes/UNeditArc.h"
-#include "codes/UNeditLine.h"
-#include "codes/UNeditPt.h"
+#include "codes/ArcStore.h"
+#include "codes/LineStore.h"
+#include "codes/PointStore.h"
 #include "platform/geometry/UWCircle.h"
 #include "platform/geometry/UWRect.h"
+#include "platform/text/NameIndex.h"
 #include "records/UNeutralFileFormat.h"
 #include "reduction/CError.h"
-#include "reduction/NameIndex.h"
 #include "reduction/ObservationModel.h"
 
 class UNeditReport;
@@ -192,6 +193,8 @@ class UNeditDatabase {
                              double bearing);
 
     // ---- Point, line and arc stores ---------------------------------------------------
+    /// SavePoint's `flags`: the caller is a PT record.
+    static constexpr unsigned kSaveFromPTRecord = 2u;
     unsigned SavePoint(const std::wstring& name, double x, double y, double z, std::wstring code,
                        int ptFlag, unsigned flags, int derived);
     unsigned SaveTravPoint(const std::wstring& name, double x, double y, double z,
@@ -223,10 +226,10 @@ class UNeditDatabase {
     void DelAdjPts();
     void ClearAddPtList();
 
-    const std::vector<UNeditPt>& GetPointList() const { return PointList; }
-    const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList; }
-    const std::vector<UNeditLine>& GetLineList() const { return LineList; }
-    const std::vector<UNeditArc>& GetArcList() const { return ArcList; }
+    const std::vector<UNeditPt>& GetPointList() const { return PointList.Items(); }
+    const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList.Items(); }
+    const std::vector<UNeditLine>& GetLineList() const { return LineList.Items(); }
+    const std::vector<UNeditArc>& GetArcList() const { return ArcList.Items(); }
     const std::vector<UWCircle>& GetCircleList() const { return CircleList; }
 
     /// The messages of the coordinate dialogs go to this host; null answers by default.
@@ -253,8 +256,6 @@ class UNeditDatabase {
     STNSTRUCT* FirstNamed(const std::wstring& name) const;
     std::vector<STNSTRUCT*> OccupiedStations(const std::wstring& name,
                                              const STNSTRUCT* observer) const;
-    void RebuildPointIndex();
-    void RebuildLineIndex();
     std::vector<std::wstring> ContentRows() const;
     // Reduction of one station, and of one target with its printing (ProcessCoord.cpp).
     struct StationWork;
@@ -330,18 +331,11 @@ class UNeditDatabase {
     std::unordered_map<std::wstring, std::size_t> BearingIndex;  // "from\x1fto" as stored
 
     // Stores of reduced geometry, with look-ups by name.
-    std::vector<UNeditPt> PointList;
-    NameIndex PointIndex{
-        [this](std::size_t i) -> const std::wstring& { return PointList[i].GetID(); }};
-    std::vector<UNeditPt> AddPtList;
-    NameIndex AddPtIndex{
-        [this](std::size_t i) -> const std::wstring& { return AddPtList[i].GetID(); }};
-    std::vector<UNeditPt> TravPtList;
-    NameIndex TravPtIndex{
-        [this](std::size_t i) -> const std::wstring& { return TravPtList[i].GetID(); }};
-    std::vector<UNeditLine> LineList;
-    std::unordered_map<std::wstring, std::size_t> LineIndex;
-    std::vector<UNeditArc> ArcList;
+    nedit::PointStore PointList;
+    nedit::PointStore AddPtList;
+    nedit::PointStore TravPtList;
+    nedit::LineStore LineList;
+    nedit::ArcStore ArcList;
     std::vector<UWCircle> CircleList;
     double XMin = -1e12, YMin = -1e12, XMax = -1e12, YMax = -1e12;
     unsigned LastPercent = 1000;  // none reported yet
