@@ -31,7 +31,8 @@ class USurveyDoc;
 
 namespace nedit {
 class DialogHost;
-}
+class RunStage;
+}  // namespace nedit
 
 class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::ReportContext {
   public:
@@ -74,6 +75,9 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     int SetupDataBase(UListCtrl* list);
     /// A new engine runs over a neutral file, read into the document's list.
     int SetupDataBase(const std::wstring& path);
+    /// Adds a stage of a higher room (routes, attachments) to every engine this document
+    /// builds from now on. The stage must outlive the document.
+    void AddRunStage(nedit::RunStage* stage) { RunStages.push_back(stage); }
     /// Offers to clear the report, then SetupDataBase(list).
     void Regenerate(UListCtrl* list);
     UNeditDatabase* GetDatabase() const { return Database.get(); }
@@ -146,6 +150,7 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     std::wstring NeuFileName;
     std::unique_ptr<UListCtrl> List;
     std::unique_ptr<UNeditDatabase> Database;
+    std::vector<nedit::RunStage*> RunStages;
     std::unique_ptr<UNeditReport> NReport;
     OutParamStruct OutputParameters;
     UNeditSettings NeditSettings;

@@ -115,7 +115,14 @@ int UNeditDatabase::Process() {
     const int result = ProcessCoord(6, Output ? 1 : 0, 0, nullptr);
     UseForAll = false;
     SetMinMaxCoord();
-    return result == 0 ? 0 : 1;
+    if (result == 0) return 0;
+    RunStages(nedit::RunStep::Routes);
+    RunStages(nedit::RunStep::Attachments);
+    return 1;
+}
+
+void UNeditDatabase::RunStages(nedit::RunStep step) {
+    for (nedit::RunStage* stage : Stages) stage->Run(*this, step);
 }
 
 void UNeditDatabase::ResetForRerun() {
@@ -133,8 +140,9 @@ void UNeditDatabase::Regenerate() {
     LoadBearingArray();
     if (!ProcessAverageMeas()) return;
     ProcessAverageAngle();
-    ProcessCoord(6, 0, 0, nullptr);
+    const int result = ProcessCoord(6, 0, 0, nullptr);
     SetMinMaxCoord();
+    if (result != 0) RunStages(nedit::RunStep::Routes);
 }
 
 void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRoutes) {
@@ -149,6 +157,7 @@ void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRo
         UseForAll = false;
         SetMinMaxCoord();
     }
+    if (result != 0 && findRoutes) RunStages(nedit::RunStep::Routes);
 }
 
 std::vector<std::wstring> UNeditDatabase::ContentRows() const {

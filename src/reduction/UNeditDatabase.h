@@ -22,6 +22,7 @@
 #include "records/UNeutralFileFormat.h"
 #include "reduction/CError.h"
 #include "reduction/ObservationModel.h"
+#include "reduction/RunStage.h"
 
 class UNeditReport;
 class USurveyDoc;
@@ -70,6 +71,10 @@ class UNeditDatabase {
     /// The last error code, without showing its message.
     int GetErrorCode() const { return ErrorCode; }
     void UpdateProgress(unsigned percent, std::wstring_view text);
+
+    /// Adds a stage of a higher room to every run of this engine, after those added before.
+    /// The stage must outlive the engine.
+    void AddStage(nedit::RunStage* stage) { Stages.push_back(stage); }
 
     void SetOutput(bool output) { Output = output; }
     bool GetOutput() const { return Output; }
@@ -237,6 +242,7 @@ class UNeditDatabase {
 
   private:
     bool AbortRequested() const;
+    void RunStages(nedit::RunStep step);
     void ResetForRerun();
     void AppendStation(std::unique_ptr<STNSTRUCT> station);
     void ResetPassValues();
@@ -284,6 +290,7 @@ class UNeditDatabase {
     nedit::ProgressSink* Progress;
     CError ErrorSink;
     std::function<void(int)> AngleTypeHandler;
+    std::vector<nedit::RunStage*> Stages;
     std::wstring FileName;
 
     // Running values of a pass.
