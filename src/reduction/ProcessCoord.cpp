@@ -192,7 +192,7 @@ void UNeditDatabase::AskBackStation(const STNSTRUCT& station, StationWork& work,
                                     const UWPoint& here) {
     UBKBCoordDlg dialog(station.BkStnName);
     // The dialog has OK only: whatever stands in its fields is taken.
-    if (Host != nullptr) Host->RunDialog(dialog);
+    if (Host != nullptr) Host->Run(dialog);
     if (dialog.ApplyBearing) {
         work.BackBearing = dialog.Bearing;
         const int row = FindRecord(rec::Bkb, station.BkStnName);

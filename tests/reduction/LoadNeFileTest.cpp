@@ -6,7 +6,7 @@
 
 #include "../records/RecordFixture.h"
 #include "../records/RowList.h"
-#include "platform/messages/HeadlessDialogHost.h"
+#include "../support/HeadlessDialogHost.h"
 #include "reduction/UNeditDatabase.h"
 
 namespace {

@@ -8,7 +8,7 @@
 
 #include "../records/RecordFixture.h"
 #include "../records/RowList.h"
-#include "platform/messages/HeadlessDialogHost.h"
+#include "../support/HeadlessDialogHost.h"
 #include "reduction/UNeditDatabase.h"
 
 class ReductionFixture : public RecordFixture {

@@ -5,6 +5,7 @@
 
 #include "ReductionFixture.h"
 #include "reduction/RunStage.h"
+#include "reduction/UCoordEntryDlg.h"
 
 namespace {
 
@@ -61,8 +62,7 @@ TEST_F(RunStages, ReRunsCallOnlyTheRoutes) {
 TEST_F(RunStages, AWalkThatFailsCallsNoStage) {
     RecordingStage stage;
     engine.AddStage(&stage);
-    host.SetDialogScript(L"Control Point Coordinate",
-                         [](nedit::UDialogLogic&) { return nedit::mb::IdCancel; });
+    host.SetFace<UCoordEntryDlg>([](UCoordEntryDlg&) { return nedit::mb::IdCancel; });
     Rows(L"#VERSION-1.0 NEUTRAL FILE\nSTN ID=K\nSS ID=Q,HA=0,VA=90,SD=5,HT=0\n");
     EXPECT_EQ(engine.Process(), 0);
     EXPECT_TRUE(stage.calls.empty());
