@@ -19,6 +19,7 @@
 #include "platform/job/UDocument.h"
 #include "platform/job/UJobSettings.h"
 #include "platform/messages/ProgressSink.h"
+#include "platform/storage/UStorage.h"
 #include "records/UNeutralFileFormat.h"
 #include "report/NeditIni.h"
 #include "report/OutParamStruct.h"
@@ -38,9 +39,10 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
   public:
     static constexpr const wchar_t* kNeutralDataStream = L"NeutralData";
     static constexpr const wchar_t* kSettingsStream = L"Settings";
-    /// Stream modes: exclusive read-write to read, create-exclusive-write to write.
-    static constexpr unsigned kReadMode = 18;
-    static constexpr unsigned kCreateMode = 4113;
+    /// Stream modes: exclusive read-write to read (18), create-exclusive-write to write (4113).
+    static constexpr unsigned kReadMode = nedit::stgm::ShareExclusive | nedit::stgm::ReadWrite;
+    static constexpr unsigned kCreateMode =
+        nedit::stgm::Create | nedit::stgm::ShareExclusive | nedit::stgm::Write;
 
     /// A document of `job` (may be null: the defaults of a new job hold). Loads the record
     /// definition, reads the report's column flags from NEDIT.INI and takes the job's units.

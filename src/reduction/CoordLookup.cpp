@@ -49,7 +49,7 @@ int UNeditDatabase::findCoord(const std::wstring& name, double& e, double& n, do
 
     if (JobHasPoint(name)) {
         if (DbCoordNames.count(name) != 0 && GetCoordFromSvyDoc(name, e, n, z, code)) {
-            setCoord(name, e, n, z, code, 8, fix, 0);
+            setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
             return 1;
         }
         if (LocalCoordNames.count(name) == 0) {
@@ -58,7 +58,7 @@ int UNeditDatabase::findCoord(const std::wstring& name, double& e, double& n, do
                 return 0;
             }
             if (DbCoordNames.count(name) != 0) return 1;
-            setCoord(name, e, n, z, code, 8, fix, 0);
+            setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
             SaveTravPoint(name, e, n, z, code, 1);
             return 1;
         }
@@ -67,21 +67,21 @@ int UNeditDatabase::findCoord(const std::wstring& name, double& e, double& n, do
     const auto known = KnownCoordMap.find(name);
     if (known == KnownCoordMap.end()) {
         if (!GetPointFromPtList(name, e, n, z, code, 0)) return 0;
-        setCoord(name, e, n, z, code, 8, fix, 0);
+        setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
         return 1;
     }
     e = known->second.East;
     n = known->second.North;
     z = known->second.Height;
     if (LocalCoordNames.count(name) != 0) {
-        setCoord(name, e, n, z, code, 8, fix, 0);
+        setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
         return 1;
     }
     if (!getCoord(name, &e, &n, &z, code, 1, askUser)) {
         ErrorCode = -11;
         return 0;
     }
-    setCoord(name, e, n, z, code, 8, fix, 0);
+    setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
     SaveTravPoint(name, e, n, z, code, 1);
     return 1;
 }
@@ -147,7 +147,7 @@ int UNeditDatabase::setCoord(const std::wstring& name, double e, double n, doubl
     if (STNSTRUCT* first = FirstNamed(name)) {
         bool written = false;
         for (STNSTRUCT* station = first; station != nullptr; station = station->NextSameName) {
-            if (station->CoordKnown && (flags & 8) == 0) {
+            if (station->CoordKnown && (flags & kSetCoordOverwrite) == 0) {
                 SavePoint(name, e, n, z, code, ptFlag, 0, 0);
                 continue;
             }

@@ -131,11 +131,14 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
 
         work.HasShots = HaveSideshotsToReport(&station, records);
         work.HeadPrinted = false;
-        if (printing && !(passes == 4 && !work.HasShots)) PrintStationBlock(station, work);
+        // A side-shot pass alone (after an adjustment) prints only stations with shots.
+        if (printing && !(passes == kSideShotPass && !work.HasShots))
+            PrintStationBlock(station, work);
 
-        if ((passes & 2) != 0 && !station.FSList.empty() && !ForwardPass(station, work, report))
+        if ((passes & kForwardPass) != 0 && !station.FSList.empty() &&
+            !ForwardPass(station, work, report))
             aborted = true;
-        if (!aborted && (passes & 4) != 0 && !station.SSList.empty() &&
+        if (!aborted && (passes & kSideShotPass) != 0 && !station.SSList.empty() &&
             !SideShotPass(station, work, report)) {
             aborted = true;
         }
@@ -235,7 +238,7 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
             UpdateProgress(100, L"");
             return false;
         }
-        setCoord(name, e, n, z, work.StnCodeOut, 8, fix, 1);
+        setCoord(name, e, n, z, work.StnCodeOut, kSetCoordOverwrite, fix, 1);
         station.CoordKnown = 1;
         SaveTravPoint(name, e, n, z, work.StnCodeOut, 1);
         work.StnE = e;
@@ -251,7 +254,8 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
     if (station.CoordKnown) {
         if (fixedOnly) return kStationLeftOut;
         take_node();
-        setCoord(name, work.StnE, work.StnN, work.StnZ, station.StnCode, 8, report, 1);
+        setCoord(name, work.StnE, work.StnN, work.StnZ, station.StnCode, kSetCoordOverwrite, report,
+                 1);
         SaveTravPoint(name, work.StnE, work.StnN, work.StnZ, station.StnCode, 1);
         return kPositionFound;
     }
@@ -302,7 +306,7 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
         if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, true);
         if (IsSelfObservation(station, target)) continue;
         if (searchSTN(target.SSName) != nullptr)
-            setCoord(target.SSName, e, n, z, target.SSCode, 8, report, 0);
+            setCoord(target.SSName, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
         const int to = GetPointIdx(target.SSName);
         if (from >= 0 && to >= 0 && from != to)
             SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 0);
@@ -325,7 +329,7 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
         ReduceTarget(station, target, work, e, n, z);
         if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, false);
         if (IsSelfObservation(station, target)) continue;
-        setCoord(target.SSName, e, n, z, target.SSCode, 8, report, 0);
+        setCoord(target.SSName, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
     }
     return 1;
 }

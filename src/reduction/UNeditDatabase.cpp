@@ -112,7 +112,7 @@ int UNeditDatabase::Process() {
     LoadBearingArray();
     ProcessAverageMeas();
     ProcessAverageAngle();
-    const int result = ProcessCoord(6, Output ? 1 : 0, 0, nullptr);
+    const int result = ProcessCoord(kAllPasses, Output ? 1 : 0, 0, nullptr);
     UseForAll = false;
     SetMinMaxCoord();
     if (result == 0) return 0;
@@ -140,7 +140,7 @@ void UNeditDatabase::Regenerate() {
     LoadBearingArray();
     if (!ProcessAverageMeas()) return;
     ProcessAverageAngle();
-    const int result = ProcessCoord(6, 0, 0, nullptr);
+    const int result = ProcessCoord(kAllPasses, 0, 0, nullptr);
     SetMinMaxCoord();
     if (result != 0) RunStages(nedit::RunStep::Routes);
 }
@@ -152,7 +152,7 @@ void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRo
     LoadBearingArray();
     ProcessAverageMeas();
     ProcessAverageAngle();
-    const int result = ProcessCoord(6, 1, 0, nullptr);
+    const int result = ProcessCoord(kAllPasses, 1, 0, nullptr);
     if (result == 0 || findRoutes) {
         UseForAll = false;
         SetMinMaxCoord();

@@ -155,6 +155,9 @@ class UNeditDatabase {
                   int fix, bool askUser);
     int getCoord(const std::wstring& name, double* e, double* n, double* z, std::wstring& code,
                  int clear, bool showDialog);
+    /// setCoord's `flags`: write over the stations of that name whose coordinates are known
+    /// already; without it such a station keeps them and only the point is saved.
+    static constexpr int kSetCoordOverwrite = 8;
     int setCoord(const std::wstring& name, double e, double n, double z, const std::wstring& code,
                  int flags, int fix, int ptFlag);
     int GetCoordFromStnList(const std::wstring& name, double& e, double& n, double& z,
@@ -188,6 +191,11 @@ class UNeditDatabase {
     const std::vector<ULINEBEAR_STRUCT>& GetLineBearings() const { return LineBearings; }
 
     // ---- Reduction --------------------------------------------------------------------
+    /// ProcessCoord's passes, bits that may be combined: the forward observations, which
+    /// position later stations, and the side shots. A run makes both.
+    static constexpr int kForwardPass = 2;
+    static constexpr int kSideShotPass = 4;
+    static constexpr int kAllPasses = kForwardPass | kSideShotPass;
     int ProcessCoord(int passes, int report, int fixedOnly, std::vector<std::wstring>* records);
     /// A station has side shots, points or check shots whose lines the report prints.
     bool HaveSideshotsToReport(const STNSTRUCT* station,

@@ -258,11 +258,14 @@ int UNeditReport::PrintTraverseInfo(double dE, double dN, double dH, double brg,
     // Lengths here follow the job's settings, not the report's output unit.
     const UJobSettings& job = Settings();
     KeepLines(7);
-    const std::wstring east = job.LengthToString(dE, false, false, 3, -1, true, false);
-    const std::wstring north = job.LengthToString(dN, false, false, 3, -1, true, false);
+    using namespace nedit::length;
+    const std::wstring east =
+        job.LengthToString(dE, kNoUnit, kNoSign, 3, kJobInchFraction, kCoordinate, kUnused);
+    const std::wstring north =
+        job.LengthToString(dN, kNoUnit, kNoSign, 3, kJobInchFraction, kCoordinate, kUnused);
     // Heights and areas are in the job's unit already, as the job shows them.
-    const std::wstring height =
-        job.UnitLengthToString(Is_Zero(dH, false) ? 0.0 : dH, false, false, 3, -1, false);
+    const std::wstring height = job.UnitLengthToString(Is_Zero(dH, false) ? 0.0 : dH, kNoUnit,
+                                                       kNoSign, 3, kJobInchFraction, kUnused);
     W(Translate(XYFlag ? L"                               East Diff            North Diff          "
                          L" Elev Diff"
                        : L"                               North Diff           East Diff           "
@@ -277,11 +280,11 @@ int UNeditReport::PrintTraverseInfo(double dE, double dN, double dH, double brg,
     };
     W(Format(L"%s               %-20s %s             %-20s", Translate(L"Misclose Bearing"),
              angle_text(brg), Translate(L"Distance"),
-             job.DistanceToString(dist, false, false, 3, -1, false, false)),
+             job.DistanceToString(dist, kNoUnit, kNoSign, 3, kJobInchFraction, kUnused, kUnused)),
       0, 1);
     W(Format(L"%s                  %-20.3f %s      %-20s", Translate(L"Enclosed Area"),
              area > 0.0 ? area : 0.0, Translate(L"Traverse Length"),
-             job.DistanceToString(length, false, false, 3, -1, false, false)),
+             job.DistanceToString(length, kNoUnit, kNoSign, 3, kJobInchFraction, kUnused, kUnused)),
       0, 1);
     W(Format(L"%s                  %-20d %s             %-20s", Translate(L"No  of Setups"), setups,
              Translate(L"Accuracy"), accuracy),

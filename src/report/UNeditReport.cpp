@@ -151,7 +151,9 @@ std::wstring UNeditReport::ConvertToDistDisplayUnit(double length, int decimals)
         feet.SetFootFormat(Settings().GetFootFormat());
         feet.SetFootInchPrecision(Settings().GetFootInchPrecision());
         feet.SetLengthUnit(nedit::LengthUnit::Feet);
-        return feet.UnitLengthToString(value, false, false, -1, -1, false);
+        using namespace nedit::length;
+        return feet.UnitLengthToString(value, kNoUnit, kNoSign, kJobDecimals, kJobInchFraction,
+                                       kUnused);
     }
     return nedit::Format(L"%.*f", decimals, value);
 }
