@@ -4,26 +4,14 @@
 
 #include "platform/text/Format.h"
 #include "platform/text/WideText.h"
-#include "records/RecordTypes.h"
-#include "records/UNeutralFileFormat.h"
+#include "records/RecordText.h"
 
 UListCtrl::UListCtrl(const UNeutralFileFormat* format) : format_(format) {}
 
 // ---- Rows -------------------------------------------------------------------------------
 
 std::wstring UListCtrl::NormaliseRecord(const std::wstring& text) const {
-    // Blanks around a row carry nothing, and a leading one would hide the record's key.
-    std::wstring row = format_->MakeUpperCaseString(std::wstring(nedit::TrimView(text)));
-    if (!row.empty() && row[0] != L'#') {
-        int type = rec::None;
-        if (format_->FindRecordKey(row.substr(0, row.find_first_of(L" ,")), type)) {
-            row = format_->FormatRecord(type, row);
-        } else {
-            row.insert(0, L"# ");
-        }
-    }
-    if (row.size() > static_cast<std::size_t>(kMaxRowLength)) row.resize(kMaxRowLength);
-    return row;
+    return NormaliseRow(*format_, text);
 }
 
 int UListCtrl::AddRecord(int row, const std::wstring& text) {

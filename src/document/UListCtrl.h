@@ -3,7 +3,8 @@
 // one neutral record held as text; there is no parsed form behind a row. Beside the rows the
 // list keeps a multi-selection and a focused row, and carries out the list's commands (copy,
 // paste, delete, comment, find, drag, keys, printing) on them. Painting is the widget's; it
-// follows the list through nedit::ListEvents.
+// follows the list through nedit::ListEvents. The engine reads and writes it as its
+// nedit::RowSource.
 //
 // Decisions where the behaviour of the list is otherwise open:
 // - A copy that cannot reach the clipboard is no copy: CopyFrom keeps its value, so a paste
@@ -27,6 +28,7 @@
 #include <vector>
 
 #include "document/ListInterfaces.h"
+#include "records/RowSource.h"
 
 class UNeutralFileFormat;
 
@@ -65,7 +67,7 @@ struct ListPage {
 
 }  // namespace nedit
 
-class UListCtrl {
+class UListCtrl : public nedit::RowSource {
   public:
     /// The column header before any row has been selected.
     static constexpr const wchar_t* kInitialHeader = L"Neutral File Records";
@@ -92,25 +94,23 @@ class UListCtrl {
     /// Normalises `text` and, when the result is not empty, inserts it at `row` (a row past
     /// the end appends). Gives the row it went in at, or -1. A row that went in is shown in
     /// the form, except while a long operation runs.
-    int AddRecord(int row, const std::wstring& text);
+    int AddRecord(int row, const std::wstring& text) override;
     /// Normalises `text` and, when the result is not empty and `row` exists, replaces the
     /// row's text. Gives the row, or -1.
-    int SetRecord(int row, const std::wstring& text);
-    /// The gate of every row: trimmed and upper-cased; an empty text or a comment as it is; a known
-    /// key laid out by the format; an unknown key made a comment with "# " in front. The result is
-    /// cut to the row limit of 255 characters.
+    int SetRecord(int row, const std::wstring& text) override;
+    /// The gate of every row (NormaliseRow) with this list's format.
     std::wstring NormaliseRecord(const std::wstring& text) const;
 
-    int GetItemCount() const { return static_cast<int>(rows_.size()); }
+    int GetItemCount() const override { return static_cast<int>(rows_.size()); }
     /// The row's text; empty for a row that does not exist.
-    std::wstring GetItemText(int row) const;
+    std::wstring GetItemText(int row) const override;
     /// Removes every row, with the selection and the focus.
-    void DeleteAllItems();
+    void DeleteAllItems() override;
     /// Removes the row; a row that does not exist is left alone.
-    void DeleteItem(int row);
+    void DeleteItem(int row) override;
     void Reserve(std::size_t rows);
     /// All rows, in order, for readers that walk the whole list.
-    const std::vector<std::wstring>& GetRows() const { return rows_; }
+    const std::vector<std::wstring>& GetRows() const override { return rows_; }
 
     // ---- Selection and focus. Rows that do not exist are ignored by the setters.
     int GetSelectedCount() const;

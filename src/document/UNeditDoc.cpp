@@ -195,6 +195,7 @@ int UNeditDoc::SetupDataBase(const std::wstring& path) {
 void UNeditDoc::StartEngine(UListCtrl* list) {
     Database = std::make_unique<UNeditDatabase>(this, list, SurveyDoc, Host, &Progress, L"*CHK");
     Database->SetReportPtr(NReport.get());
+    for (nedit::RunStage* stage : RunStages) Database->AddStage(stage);
     Database->SetFileName(NeuFileName);  // the bearing store lies beside the neutral file
 }
 
@@ -308,48 +309,48 @@ int UNeditDoc::OnCmdMsg(unsigned id, int code, void* extra) {
     auto terminate_top = [this](unsigned command) {
         if (XInput* top = Top()) top->Terminate(static_cast<int>(command));
     };
-    if (id == 32766 || id == 33572 || (id >= 33573 && id <= 33582) || id == 33584 || id == 33585 ||
-        id == 33589 || id == 33592 || id == 33593) {
+    if (nedit::input::EndsInput(id)) {
         terminate_top(id);
         return 1;
     }
+    using namespace nedit::input;
     switch (id) {
-        case 32776:
+        case kAbortModalOption:
             OnAbortModalOption();
             return 1;
-        case 32777:
+        case kSetOptionValueA:
             OptionValueA = *static_cast<int*>(extra);
             return 1;
-        case 32778:
+        case kGetOptionValueA:
             *static_cast<int*>(extra) = OptionValueA;
             return 1;
-        case 32779:
+        case kSetOptionValueB:
             OptionValueB = *static_cast<int*>(extra);
             return 1;
-        case 32780:
+        case kGetOptionValueB:
             *static_cast<int*>(extra) = OptionValueB;
             return 1;
-        case 32781:
+        case kGetOptionIdsB:
             *static_cast<std::vector<unsigned>**>(extra) = &OptionIdsB;
             return 1;
-        case 32782:
+        case kGetOptionIdsA:
             *static_cast<std::vector<unsigned>**>(extra) = &OptionIdsA;
             return 1;
-        case 32968:
+        case kPushInput:
             return Push(static_cast<XInput*>(extra));
-        case 32969:
+        case kPopInput:
             *static_cast<XInput**>(extra) = Pop();
             return 1;
-        case 32970:
+        case kTopInput:
             *static_cast<XInput**>(extra) = Top();
             return 1;
-        case 32972:
+        case kGetOption:
             *static_cast<XInputOption**>(extra) = GetOption();
             return 1;
-        case 32973:
+        case kRemoveOption:
             *static_cast<XInputOption**>(extra) = RemoveOption();
             return 1;
-        case 32977:
+        case kGetInputStack:
             *static_cast<std::vector<XInput*>**>(extra) = &InputStack;
             return 1;
         default:

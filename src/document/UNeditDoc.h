@@ -2,7 +2,7 @@
 // A raw-data document: one set of field observations inside a job. It is the record service
 // for its records, keeps their text in the "NeutralData" stream of its storage and its plan
 // settings in "Settings", owns the engine of its last reduction and the report, and holds the
-// report parameters.
+// report parameters: it is the report's context.
 //
 // Decisions:
 // - A stored stream whose first line is no neutral-file header is still read row by row:
@@ -19,9 +19,11 @@
 #include "platform/job/UDocument.h"
 #include "platform/job/UJobSettings.h"
 #include "platform/messages/ProgressSink.h"
+#include "platform/storage/UStorage.h"
 #include "records/UNeutralFileFormat.h"
 #include "report/NeditIni.h"
 #include "report/OutParamStruct.h"
+#include "report/ReportContext.h"
 
 class UListCtrl;
 class UNeditDatabase;
@@ -30,15 +32,17 @@ class USurveyDoc;
 
 namespace nedit {
 class DialogHost;
-}
+class RunStage;
+}  // namespace nedit
 
-class UNeditDoc : public UDocument, public UNeutralFileFormat {
+class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::ReportContext {
   public:
     static constexpr const wchar_t* kNeutralDataStream = L"NeutralData";
     static constexpr const wchar_t* kSettingsStream = L"Settings";
-    /// Stream modes: exclusive read-write to read, create-exclusive-write to write.
-    static constexpr unsigned kReadMode = 18;
-    static constexpr unsigned kCreateMode = 4113;
+    /// Stream modes: exclusive read-write to read (18), create-exclusive-write to write (4113).
+    static constexpr unsigned kReadMode = nedit::stgm::ShareExclusive | nedit::stgm::ReadWrite;
+    static constexpr unsigned kCreateMode =
+        nedit::stgm::Create | nedit::stgm::ShareExclusive | nedit::stgm::Write;
 
     /// A document of `job` (may be null: the defaults of a new job hold). Loads the record
     /// definition, reads the report's column flags from NEDIT.INI and takes the job's units.
@@ -73,6 +77,9 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat {
     int SetupDataBase(UListCtrl* list);
     /// A new engine runs over a neutral file, read into the document's list.
     int SetupDataBase(const std::wstring& path);
+    /// Adds a stage of a higher room (routes, attachments) to every engine this document
+    /// builds from now on. The stage must outlive the document.
+    void AddRunStage(nedit::RunStage* stage) { RunStages.push_back(stage); }
     /// Offers to clear the report, then SetupDataBase(list).
     void Regenerate(UListCtrl* list);
     UNeditDatabase* GetDatabase() const { return Database.get(); }
@@ -86,16 +93,20 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat {
     void ClearReport();
     int GetCheckOn(int id) const { return ::GetCheckOn(OutputParameters, id); }
     OutParamStruct& GetOutputParameters() { return OutputParameters; }
+    const OutParamStruct& GetOutputParameters() const override { return OutputParameters; }
     int GetPageSize() const { return OutputParameters.PageSize; }
     /// True when the job shows easting before northing.
-    bool IsENOrder() const { return Settings.GetCoordinateOrder() == UJobSettings::kEastNorth; }
+    bool IsENOrder() const override {
+        return Settings.GetCoordinateOrder() == UJobSettings::kEastNorth;
+    }
     /// Takes the job's settings again, its units as output units, and tells the report.
     void UpdateDisplaySettings();
 
     // ---- Plain access ---------------------------------------------------------------------------
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
     USurveyDoc* GetSurveyDocument() const override { return SurveyDoc; }
-    const UJobSettings& GetSettings() const { return Settings; }
+    const UJobSettings& GetSettings() const override { return Settings; }
+    const UNeutralFileFormat& GetRecordFormat() const override { return *this; }
     UNeditSettings& GetNeditSettings() { return NeditSettings; }
     const std::wstring& GetNeuText() const { return NeuText; }
     const std::wstring& GetNeuFileName() const { return NeuFileName; }
@@ -141,6 +152,7 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat {
     std::wstring NeuFileName;
     std::unique_ptr<UListCtrl> List;
     std::unique_ptr<UNeditDatabase> Database;
+    std::vector<nedit::RunStage*> RunStages;
     std::unique_ptr<UNeditReport> NReport;
     OutParamStruct OutputParameters;
     UNeditSettings NeditSettings;

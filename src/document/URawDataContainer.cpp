@@ -8,6 +8,15 @@
 #include "platform/text/Format.h"
 #include "platform/text/WideText.h"
 
+namespace {
+
+// A new document's storage holds its streams back until it is committed, so that they reach
+// the job together (69650).
+constexpr unsigned kNewDocumentMode = nedit::stgm::Transacted | nedit::stgm::Create |
+                                      nedit::stgm::ShareExclusive | nedit::stgm::ReadWrite;
+
+}  // namespace
+
 URawDataContainer::URawDataContainer(USurveyDoc* job) : Job(job) {}
 
 URawDataContainer::~URawDataContainer() = default;
@@ -78,7 +87,7 @@ int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseNam
     nedit::LineReader reader;
     if (!reader.Open(nedit::ToUtf8(path))) return 0;
     UStorage storage;
-    if (!storage.Create(*GetStorage(), name, 69650)) return 0;
+    if (!storage.Create(*GetStorage(), name, kNewDocumentMode)) return 0;
     UStreamFile stream;
     if (!stream.CreateStream(storage, UNeditDoc::kNeutralDataStream, UNeditDoc::kCreateMode)) {
         storage.Release();
@@ -96,7 +105,7 @@ int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseNam
         settings.Write(bytes.data(), bytes.size());
         settings.Close();
     }
-    if (!storage.Commit() || !Commit(2)) return 0;
+    if (!storage.Commit() || !Commit(nedit::stgc::OnlyIfCurrent)) return 0;
     storage.Release();
 
     auto doc = std::make_unique<UNeditDoc>(Job);

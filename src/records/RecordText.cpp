@@ -1,6 +1,8 @@
 #include "records/RecordText.h"
 
 #include "platform/text/WideText.h"
+#include "records/RecordTypes.h"
+#include "records/UNeutralFileFormat.h"
 
 std::wstring GetDelimToken(std::wstring_view text, int n, std::wstring_view delimiters) {
     if (n < 0) return {};
@@ -84,4 +86,19 @@ int GetAngleType(std::wstring_view row) {
         default:
             return 0;
     }
+}
+
+std::wstring NormaliseRow(const UNeutralFileFormat& format, const std::wstring& text) {
+    // Blanks around a row carry nothing, and a leading one would hide the record's key.
+    std::wstring row = format.MakeUpperCaseString(std::wstring(nedit::TrimView(text)));
+    if (!row.empty() && row[0] != L'#') {
+        int type = rec::None;
+        if (format.FindRecordKey(row.substr(0, row.find_first_of(L" ,")), type)) {
+            row = format.FormatRecord(type, row);
+        } else {
+            row.insert(0, L"# ");
+        }
+    }
+    if (row.size() > static_cast<std::size_t>(kMaxRowLength)) row.resize(kMaxRowLength);
+    return row;
 }

@@ -4,6 +4,8 @@
 #include <string>
 #include <string_view>
 
+class UNeutralFileFormat;
+
 /// The n-th token of `text`, tokens being separated by single blanks or commas, each
 /// separator counting (two blanks in a row make an empty token); trimmed and upper-cased.
 /// Token 0 of a record is its key. Empty when there is no n-th token.
@@ -24,3 +26,9 @@ std::wstring GetIdText(std::wstring_view record);
 /// The angular unit that a row sets with "UA=": 1 for "1" or "D", 2 for "2" or "G", else 0
 /// (also when the row has no "UA="). Blanks after "=" are skipped.
 int GetAngleType(std::wstring_view row);
+
+/// The gate of every row that enters a document's rows: trimmed and upper-cased; an empty
+/// text or a comment as it is; a known key laid out by `format`; an unknown key made a
+/// comment with "# " in front, so that nothing is lost. The result is cut to the row limit of
+/// 255 characters.
+std::wstring NormaliseRow(const UNeutralFileFormat& format, const std::wstring& text);

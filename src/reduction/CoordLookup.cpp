@@ -3,13 +3,13 @@
 
 #include <fstream>
 
-#include "document/UListCtrl.h"
 #include "platform/geometry/UAngle.h"
 #include "platform/io/LineReader.h"
 #include "platform/text/Format.h"
 #include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
+#include "records/RowSource.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "reduction/UNeditDatabase.h"
 
@@ -49,7 +49,7 @@ int UNeditDatabase::findCoord(const std::wstring& name, double& e, double& n, do
 
     if (JobHasPoint(name)) {
         if (DbCoordNames.count(name) != 0 && GetCoordFromSvyDoc(name, e, n, z, code)) {
-            setCoord(name, e, n, z, code, 8, fix, 0);
+            setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
             return 1;
         }
         if (LocalCoordNames.count(name) == 0) {
@@ -58,7 +58,7 @@ int UNeditDatabase::findCoord(const std::wstring& name, double& e, double& n, do
                 return 0;
             }
             if (DbCoordNames.count(name) != 0) return 1;
-            setCoord(name, e, n, z, code, 8, fix, 0);
+            setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
             SaveTravPoint(name, e, n, z, code, 1);
             return 1;
         }
@@ -67,21 +67,21 @@ int UNeditDatabase::findCoord(const std::wstring& name, double& e, double& n, do
     const auto known = KnownCoordMap.find(name);
     if (known == KnownCoordMap.end()) {
         if (!GetPointFromPtList(name, e, n, z, code, 0)) return 0;
-        setCoord(name, e, n, z, code, 8, fix, 0);
+        setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
         return 1;
     }
     e = known->second.East;
     n = known->second.North;
     z = known->second.Height;
     if (LocalCoordNames.count(name) != 0) {
-        setCoord(name, e, n, z, code, 8, fix, 0);
+        setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
         return 1;
     }
     if (!getCoord(name, &e, &n, &z, code, 1, askUser)) {
         ErrorCode = -11;
         return 0;
     }
-    setCoord(name, e, n, z, code, 8, fix, 0);
+    setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
     SaveTravPoint(name, e, n, z, code, 1);
     return 1;
 }
@@ -147,7 +147,7 @@ int UNeditDatabase::setCoord(const std::wstring& name, double e, double n, doubl
     if (STNSTRUCT* first = FirstNamed(name)) {
         bool written = false;
         for (STNSTRUCT* station = first; station != nullptr; station = station->NextSameName) {
-            if (station->CoordKnown && (flags & 8) == 0) {
+            if (station->CoordKnown && (flags & kSetCoordOverwrite) == 0) {
                 SavePoint(name, e, n, z, code, ptFlag, 0, 0);
                 continue;
             }
@@ -205,11 +205,11 @@ int UNeditDatabase::GetPointFromPtList(const std::wstring& name, double& e, doub
     return mode == 1 && point.IsPTRecord() ? 0 : 1;
 }
 
-int UNeditDatabase::FindCoordinateRow(const std::wstring& name, bool coordinates, int type,
-                                      double* e, double* n, double* z) {
-    if (ListCtrl == nullptr || Doc == nullptr) return -1;
-    for (int row = 0; row < ListCtrl->GetItemCount(); ++row) {
-        const std::wstring text = nedit::ToUpper(nedit::TrimView(ListCtrl->GetItemText(row)));
+int UNeditDatabase::FindCoordinateRow(const nedit::RowSource* rows, const std::wstring& name,
+                                      bool coordinates, int type, double* e, double* n, double* z) {
+    if (rows == nullptr || Doc == nullptr) return -1;
+    for (int row = 0; row < rows->GetItemCount(); ++row) {
+        const std::wstring text = nedit::ToUpper(nedit::TrimView(rows->GetItemText(row)));
         const int row_type = Doc->GetRecordType(text);
         const bool wanted =
             coordinates ? (row_type == rec::Xyz || row_type == rec::Yxz) : row_type == type;
@@ -226,11 +226,16 @@ int UNeditDatabase::FindCoordinateRow(const std::wstring& name, bool coordinates
 }
 
 int UNeditDatabase::FindXYZ(const std::wstring& name, double& e, double& n, double& z) {
-    return FindCoordinateRow(name, true, rec::Xyz, &e, &n, &z);
+    return FindCoordinateRow(Rows, name, true, rec::Xyz, &e, &n, &z);
+}
+
+int UNeditDatabase::FindXYZ(const nedit::RowSource& rows, const std::wstring& name, double& e,
+                            double& n, double& z) {
+    return FindCoordinateRow(&rows, name, true, rec::Xyz, &e, &n, &z);
 }
 
 int UNeditDatabase::FindRecord(int type, const std::wstring& name) {
-    return FindCoordinateRow(name, false, type, nullptr, nullptr, nullptr);
+    return FindCoordinateRow(Rows, name, false, type, nullptr, nullptr, nullptr);
 }
 
 std::wstring UNeditDatabase::FormatXYZRecord(const std::wstring& name, double e, double n,

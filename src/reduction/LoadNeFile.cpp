@@ -1,6 +1,5 @@
 // Reading a neutral text file into the record list.
 
-#include "document/UListCtrl.h"
 #include "platform/io/LineReader.h"
 #include "platform/messages/DialogHost.h"
 #include "platform/messages/Translate.h"
@@ -8,6 +7,7 @@
 #include "records/NamelessCoordinates.h"
 #include "records/RecordText.h"
 #include "records/RecordTypes.h"
+#include "records/RowSource.h"
 #include "records/UNeutralFileFormat.h"
 #include "reduction/UNeditDatabase.h"
 
@@ -19,8 +19,8 @@ constexpr int kProgressEvery = 4096;
 }  // namespace
 
 int UNeditDatabase::LoadNeFile(const std::wstring& path) {
-    if (ListCtrl == nullptr || Doc == nullptr) return 0;
-    ListCtrl->DeleteAllItems();
+    if (Rows == nullptr || Doc == nullptr) return 0;
+    Rows->DeleteAllItems();
 
     nedit::LineReader reader;
     if (!reader.Open(nedit::ToUtf8(path))) {
@@ -67,10 +67,10 @@ int UNeditDatabase::LoadNeFile(const std::wstring& path) {
         }
         row = coordinates.Complete(*Doc, type, row);
 
-        if (ListCtrl->AddRecord(next_row, row) >= 0) ++next_row;
+        if (Rows->AddRecord(next_row, row) >= 0) ++next_row;
     }
 
-    if (ListCtrl->GetItemCount() == 0) return 0;
+    if (Rows->GetItemCount() == 0) return 0;
     Output = true;
     return 1;
 }

@@ -4,13 +4,13 @@
 #include <algorithm>
 #include <cmath>
 
-#include "document/UListCtrl.h"
 #include "platform/geometry/Tolerance.h"
 #include "platform/geometry/UAngle.h"
 #include "platform/text/Format.h"
 #include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
+#include "records/RowSource.h"
 #include "reduction/UNeditDatabase.h"
 
 double CurInstHt = 0.0;
@@ -54,12 +54,12 @@ wchar_t FirstLetter(const std::wstring& text, wchar_t fallback) {
 
 int UNeditDatabase::PrepareList() {
     PrismConst = 0.0;
-    if (ListCtrl == nullptr) {
+    if (Rows == nullptr) {
         ResetPassValues();
         ErrorCode = 1;
         return 0;
     }
-    return PrepareRows(ListCtrl->GetRows());
+    return PrepareRows(Rows->GetRows());
 }
 
 int UNeditDatabase::PrepareList(const std::vector<std::wstring>& rows) {
@@ -80,8 +80,7 @@ int UNeditDatabase::PrepareRows(const std::vector<std::wstring>& rows) {
     DeleteList();
     // Every row may name a station or a point: room for all of them up front spares the
     // name tables their rehashing as a large survey fills them.
-    PointIndex.Reserve(rows.size());
-    PointList.reserve(rows.size());
+    PointList.Reserve(rows.size());
     TravFlag = 0;
     const std::size_t count = rows.size();
     std::wstring normalised;
@@ -222,7 +221,7 @@ void UNeditDatabase::ProcessPtRecord() {
     const std::wstring id = OwnValue(fld::ID);
     if (id.empty()) return;
     SavePoint(id, Number(GetValue(fld::E)), Number(GetValue(fld::N)), Number(GetValue(fld::H)),
-              OwnValue(fld::CO), 1, 2, 0);
+              OwnValue(fld::CO), 1, kSaveFromPTRecord, 0);
     if (!CurPtNames) CurPtNames = std::make_unique<std::vector<std::wstring>>();
     if (CurPtNames->empty() || !nedit::EqualsIgnoreCase(CurPtNames->back(), id)) {
         CurPtNames->push_back(id);
@@ -507,9 +506,9 @@ int UNeditDatabase::AddNewStn(const std::wstring& name) {
     station->StnName = name;
     station->Sighted = 1;
     AppendStation(std::move(station));
-    if (ListCtrl == nullptr) return 0;
-    return ListCtrl->AddRecord(ListCtrl->GetItemCount(),
-                               nedit::Format(L"%-10s ID=%s,HI=0.000,CO= ", L"STN", name)) >= 0;
+    if (Rows == nullptr) return 0;
+    return Rows->AddRecord(Rows->GetItemCount(),
+                           nedit::Format(L"%-10s ID=%s,HI=0.000,CO= ", L"STN", name)) >= 0;
 }
 
 int UNeditDatabase::DeleteForwPtr() {

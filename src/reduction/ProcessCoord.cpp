@@ -3,7 +3,7 @@
 
 #include <cmath>
 
-#include "document/UListCtrl.h"
+#include "platform/geometry/CoordinateGeometry.h"
 #include "platform/geometry/Tolerance.h"
 #include "platform/geometry/UAngle.h"
 #include "platform/geometry/UWLine.h"
@@ -12,6 +12,7 @@
 #include "platform/text/Format.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
+#include "records/RowSource.h"
 #include "reduction/UBKBCoordDlg.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "reduction/UNeditDatabase.h"
@@ -39,9 +40,7 @@ struct UNeditDatabase::StationWork {
 
 void UNeditDatabase::geo_coord(double e, double n, double bearing, double dist, double* eOut,
                                double* nOut) {
-    const double b = bearing * kRadiansPerDegree;
-    *eOut = std::sin(b) * dist + e;
-    *nOut = std::cos(b) * dist + n;
+    nedit::geo_coord(e, n, bearing, dist, eOut, nOut);
 }
 
 void UNeditDatabase::ApplyOffsets(double& e, double& n, double& z, double along, double right,
@@ -124,8 +123,7 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
             if (findCoord(station.BkStnName, be, bn, bz, back_code, report, true) &&
                 Report != nullptr) {
                 double distance = 0.0;
-                UNeditReport::geo_brgdst(work.StnE, work.StnN, be, bn, &work.BackBearing,
-                                         &distance);
+                nedit::geo_brgdst(work.StnE, work.StnN, be, bn, &work.BackBearing, &distance);
             }
         }
         const double stored = GetBearingFromArray(station.StnName, station.BkStnName);
@@ -133,11 +131,14 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
 
         work.HasShots = HaveSideshotsToReport(&station, records);
         work.HeadPrinted = false;
-        if (printing && !(passes == 4 && !work.HasShots)) PrintStationBlock(station, work);
+        // A side-shot pass alone (after an adjustment) prints only stations with shots.
+        if (printing && !(passes == kSideShotPass && !work.HasShots))
+            PrintStationBlock(station, work);
 
-        if ((passes & 2) != 0 && !station.FSList.empty() && !ForwardPass(station, work, report))
+        if ((passes & kForwardPass) != 0 && !station.FSList.empty() &&
+            !ForwardPass(station, work, report))
             aborted = true;
-        if (!aborted && (passes & 4) != 0 && !station.SSList.empty() &&
+        if (!aborted && (passes & kSideShotPass) != 0 && !station.SSList.empty() &&
             !SideShotPass(station, work, report)) {
             aborted = true;
         }
@@ -194,7 +195,7 @@ void UNeditDatabase::AskBackStation(const STNSTRUCT& station, StationWork& work,
                                     const UWPoint& here) {
     UBKBCoordDlg dialog(station.BkStnName);
     // The dialog has OK only: whatever stands in its fields is taken.
-    if (Host != nullptr) Host->RunDialog(dialog);
+    if (Host != nullptr) Host->Run(dialog);
     if (dialog.ApplyBearing) {
         work.BackBearing = dialog.Bearing;
         const int row = FindRecord(rec::Bkb, station.BkStnName);
@@ -211,7 +212,7 @@ void UNeditDatabase::AskBackStation(const STNSTRUCT& station, StationWork& work,
     double e = 0.0, n = 0.0, z = 0.0;
     const int row = FindXYZ(station.BkStnName, e, n, z);
     if (row < 0) {
-        if (ListCtrl != nullptr) ListCtrl->AddRecord(ListCtrl->GetItemCount(), text);
+        if (Rows != nullptr) Rows->AddRecord(Rows->GetItemCount(), text);
     } else if (!Is_Zero(e - dialog.East, false) || !Is_Zero(n - dialog.North, false) ||
                !Is_Zero(z - dialog.Height, false)) {
         ReplaceRow(row, text);
@@ -237,7 +238,7 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
             UpdateProgress(100, L"");
             return false;
         }
-        setCoord(name, e, n, z, work.StnCodeOut, 8, fix, 1);
+        setCoord(name, e, n, z, work.StnCodeOut, kSetCoordOverwrite, fix, 1);
         station.CoordKnown = 1;
         SaveTravPoint(name, e, n, z, work.StnCodeOut, 1);
         work.StnE = e;
@@ -253,7 +254,8 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
     if (station.CoordKnown) {
         if (fixedOnly) return kStationLeftOut;
         take_node();
-        setCoord(name, work.StnE, work.StnN, work.StnZ, station.StnCode, 8, report, 1);
+        setCoord(name, work.StnE, work.StnN, work.StnZ, station.StnCode, kSetCoordOverwrite, report,
+                 1);
         SaveTravPoint(name, work.StnE, work.StnN, work.StnZ, station.StnCode, 1);
         return kPositionFound;
     }
@@ -304,7 +306,7 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
         if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, true);
         if (IsSelfObservation(station, target)) continue;
         if (searchSTN(target.SSName) != nullptr)
-            setCoord(target.SSName, e, n, z, target.SSCode, 8, report, 0);
+            setCoord(target.SSName, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
         const int to = GetPointIdx(target.SSName);
         if (from >= 0 && to >= 0 && from != to)
             SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 0);
@@ -327,7 +329,7 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
         ReduceTarget(station, target, work, e, n, z);
         if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, false);
         if (IsSelfObservation(station, target)) continue;
-        setCoord(target.SSName, e, n, z, target.SSCode, 8, report, 0);
+        setCoord(target.SSName, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
     }
     return 1;
 }
@@ -356,10 +358,16 @@ void UNeditDatabase::PrintRunHead() {
 
 void UNeditDatabase::PrintStationBlock(const STNSTRUCT& station, const StationWork& work) {
     const bool bearing_mode = station.HMode == L'B';
-    Report->PrintOccStnBlk(
-        &station, station.StnName, work.StnE, work.StnN, work.StnZ, station.StnCode, station.HtInst,
-        GetStnScaleFactor(station.StnName), bearing_mode ? std::wstring() : station.BkStnName,
-        bearing_mode ? 0.0 : work.BackBearing, bearing_mode ? 0.0 : work.BsReading);
+    std::vector<double> back_readings;
+    if (!station.BSList.empty()) {
+        for (const MEASSTRUCT& measurement : *station.BSList.front()->Meas)
+            back_readings.push_back(measurement.HAng);
+    }
+    Report->PrintOccStnBlk(back_readings, station.StnName, work.StnE, work.StnN, work.StnZ,
+                           station.StnCode, station.HtInst, GetStnScaleFactor(station.StnName),
+                           bearing_mode ? std::wstring() : station.BkStnName,
+                           bearing_mode ? 0.0 : work.BackBearing,
+                           bearing_mode ? 0.0 : work.BsReading);
     if (!Is_Zero(station.Swing - FirstSwing, false))
         Report->PrintHeadHDegree(L"Swing", station.Swing, true);
 }

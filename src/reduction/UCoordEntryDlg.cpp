@@ -63,7 +63,7 @@ int UCoordEntryDlg::process(const std::wstring& name, bool& applyAll) {
     if (applyAll) return ProcessOnly(name);
     Name = name;
     if (Host == nullptr) return ProcessOnly(name);  // nobody to ask: the best source offered
-    const int answer = Host->RunDialog(*this);
+    const int answer = Host->Run(*this);
     if (answer != nedit::mb::IdOk) return answer;
     if (ApplyToAll) applyAll = true;
     return 1;

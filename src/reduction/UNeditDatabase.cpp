@@ -5,12 +5,12 @@
 
 #include <cstdio>
 
-#include "document/UListCtrl.h"
 #include "platform/messages/DialogHost.h"
 #include "platform/messages/ProgressSink.h"
 #include "platform/messages/Translate.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
+#include "records/RowSource.h"
 
 namespace {
 
@@ -33,11 +33,11 @@ bool IsContentType(int type) {
 
 }  // namespace
 
-UNeditDatabase::UNeditDatabase(UNeutralFileFormat* format, UListCtrl* list, USurveyDoc* job,
+UNeditDatabase::UNeditDatabase(UNeutralFileFormat* format, nedit::RowSource* rows, USurveyDoc* job,
                                nedit::DialogHost* host, nedit::ProgressSink* progress,
                                const std::wstring& chkCode)
     : Doc(format),
-      ListCtrl(list),
+      Rows(rows),
       SurveyDoc(job),
       Host(host),
       Progress(progress),
@@ -112,10 +112,17 @@ int UNeditDatabase::Process() {
     LoadBearingArray();
     ProcessAverageMeas();
     ProcessAverageAngle();
-    const int result = ProcessCoord(6, Output ? 1 : 0, 0, nullptr);
+    const int result = ProcessCoord(kAllPasses, Output ? 1 : 0, 0, nullptr);
     UseForAll = false;
     SetMinMaxCoord();
-    return result == 0 ? 0 : 1;
+    if (result == 0) return 0;
+    RunStages(nedit::RunStep::Routes);
+    RunStages(nedit::RunStep::Attachments);
+    return 1;
+}
+
+void UNeditDatabase::RunStages(nedit::RunStep step) {
+    for (nedit::RunStage* stage : Stages) stage->Run(*this, step);
 }
 
 void UNeditDatabase::ResetForRerun() {
@@ -133,8 +140,9 @@ void UNeditDatabase::Regenerate() {
     LoadBearingArray();
     if (!ProcessAverageMeas()) return;
     ProcessAverageAngle();
-    ProcessCoord(6, 0, 0, nullptr);
+    const int result = ProcessCoord(kAllPasses, 0, 0, nullptr);
     SetMinMaxCoord();
+    if (result != 0) RunStages(nedit::RunStep::Routes);
 }
 
 void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRoutes) {
@@ -144,20 +152,21 @@ void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRo
     LoadBearingArray();
     ProcessAverageMeas();
     ProcessAverageAngle();
-    const int result = ProcessCoord(6, 1, 0, nullptr);
+    const int result = ProcessCoord(kAllPasses, 1, 0, nullptr);
     if (result == 0 || findRoutes) {
         UseForAll = false;
         SetMinMaxCoord();
     }
+    if (result != 0 && findRoutes) RunStages(nedit::RunStep::Routes);
 }
 
 std::vector<std::wstring> UNeditDatabase::ContentRows() const {
     std::vector<std::wstring> rows;
-    if (ListCtrl == nullptr || Doc == nullptr) return rows;
-    rows.reserve(static_cast<std::size_t>(ListCtrl->GetItemCount()));
-    for (int row = 0; row < ListCtrl->GetItemCount(); ++row) {
-        std::wstring text = nedit::ToUpper(nedit::TrimView(
-            std::wstring_view(ListCtrl->GetItemText(row)).substr(0, kMaxRowLength)));
+    if (Rows == nullptr || Doc == nullptr) return rows;
+    rows.reserve(static_cast<std::size_t>(Rows->GetItemCount()));
+    for (int row = 0; row < Rows->GetItemCount(); ++row) {
+        std::wstring text = nedit::ToUpper(
+            nedit::TrimView(std::wstring_view(Rows->GetItemText(row)).substr(0, kMaxRowLength)));
         if (IsContentType(Doc->GetRecordType(text))) rows.push_back(std::move(text));
     }
     return rows;
@@ -168,7 +177,7 @@ void UNeditDatabase::CreateContent() {
 }
 
 bool UNeditDatabase::IsContentModified() const {
-    if (ListCtrl == nullptr || Doc == nullptr) return false;
+    if (Rows == nullptr || Doc == nullptr) return false;
     const std::vector<std::wstring> present = ContentRows();
     if (present.size() != ContentLines.size()) return true;
     FieldMap stored_fields;
@@ -192,7 +201,7 @@ bool UNeditDatabase::IsContentModified() const {
 }
 
 void UNeditDatabase::ReplaceRow(int row, const std::wstring& text) {
-    if (ListCtrl == nullptr) return;
-    ListCtrl->DeleteItem(row);
-    ListCtrl->AddRecord(row, text);
+    if (Rows == nullptr) return;
+    Rows->DeleteItem(row);
+    Rows->AddRecord(row, text);
 }

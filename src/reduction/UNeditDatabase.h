@@ -3,7 +3,8 @@
 // targets and measurements, averages them, reduces them to East, North, Height, and keeps
 // the points, lines and arcs that result. Its operations live in the source files of the
 // stage they belong to: PrepareList.cpp, Averaging.cpp, CoordLookup.cpp, ProcessCoord.cpp,
-// the run in UNeditDatabase.cpp, the stores in codes/PointStores.cpp.
+// the run in UNeditDatabase.cpp. The stores of reduced geometry are classes of codes/
+// (PointStore, LineStore, ArcStore) which the engine owns and forwards to (EngineStores.cpp).
 
 #include <functional>
 #include <map>
@@ -12,23 +13,24 @@
 #include <unordered_map>
 #include <vector>
 
-#include "codes/UNeditArc.h"
-#include "codes/UNeditLine.h"
-#include "codes/UNeditPt.h"
+#include "codes/ArcStore.h"
+#include "codes/LineStore.h"
+#include "codes/PointStore.h"
 #include "platform/geometry/UWCircle.h"
 #include "platform/geometry/UWRect.h"
+#include "platform/text/NameIndex.h"
 #include "records/UNeutralFileFormat.h"
 #include "reduction/CError.h"
-#include "reduction/NameIndex.h"
 #include "reduction/ObservationModel.h"
+#include "reduction/RunStage.h"
 
-class UListCtrl;
 class UNeditReport;
 class USurveyDoc;
 
 namespace nedit {
 class DialogHost;
 class ProgressSink;
+class RowSource;
 }  // namespace nedit
 
 /// Coordinates of a point given by an Xyz record.
@@ -44,9 +46,9 @@ extern double CurInstHt;
 
 class UNeditDatabase {
   public:
-    /// The engine of a document: its format service, record list, job and dialog host, each
-    /// of which may be null. `chkCode` is the check code, "*CHK" when empty.
-    UNeditDatabase(UNeutralFileFormat* format, UListCtrl* list, USurveyDoc* job,
+    /// The engine of a document: its format service, rows (the record list), job and dialog
+    /// host, each of which may be null. `chkCode` is the check code, "*CHK" when empty.
+    UNeditDatabase(UNeutralFileFormat* format, nedit::RowSource* rows, USurveyDoc* job,
                    nedit::DialogHost* host, nedit::ProgressSink* progress = nullptr,
                    const std::wstring& chkCode = L"");
     virtual ~UNeditDatabase();
@@ -70,9 +72,13 @@ class UNeditDatabase {
     int GetErrorCode() const { return ErrorCode; }
     void UpdateProgress(unsigned percent, std::wstring_view text);
 
+    /// Adds a stage of a higher room to every run of this engine, after those added before.
+    /// The stage must outlive the engine.
+    void AddStage(nedit::RunStage* stage) { Stages.push_back(stage); }
+
     void SetOutput(bool output) { Output = output; }
     bool GetOutput() const { return Output; }
-    void SetListCtrlPtr(UListCtrl* list) { ListCtrl = list; }
+    void SetListCtrlPtr(nedit::RowSource* rows) { Rows = rows; }
     void SetReportPtr(UNeditReport* report) { Report = report; }
     UNeditReport* GetReport() const { return Report; }
     void SetFileName(const std::wstring& name) { FileName = name; }
@@ -82,8 +88,8 @@ class UNeditDatabase {
     /// The extents of the last run's points, or of the last good run.
     UWRect GetDocExtents() const { return DocRect; }
 
-    /// Reads a neutral text file (UTF-8 path) into the record list, clearing it first.
-    /// Gives 1 when the list holds at least one row afterwards, else 0. Shows
+    /// Reads a neutral text file (UTF-8 path) into the rows, clearing them first.
+    /// Gives 1 when there is at least one row afterwards, else 0. Shows
     /// "Failed to open {1}." or "Neutral file header not found." when it cannot read.
     int LoadNeFile(const std::wstring& path);
     /// The angle type of the current angular unit letter: 1 decimal degrees, 2 gons, else 0.
@@ -128,7 +134,6 @@ class UNeditDatabase {
     wchar_t GetVMode() const { return VMode; }
     wchar_t GetAngleUnit() const { return AngleUnit; }
     wchar_t GetLengthUnit() const { return LengthUnit; }
-    UListCtrl* GetListCtrl() const { return ListCtrl; }
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
     void SetCurHMode(wchar_t mode) { HMode = mode; }
     void SetTravFlag(int flag) { TravFlag = flag; }
@@ -150,6 +155,9 @@ class UNeditDatabase {
                   int fix, bool askUser);
     int getCoord(const std::wstring& name, double* e, double* n, double* z, std::wstring& code,
                  int clear, bool showDialog);
+    /// setCoord's `flags`: write over the stations of that name whose coordinates are known
+    /// already; without it such a station keeps them and only the point is saved.
+    static constexpr int kSetCoordOverwrite = 8;
     int setCoord(const std::wstring& name, double e, double n, double z, const std::wstring& code,
                  int flags, int fix, int ptFlag);
     int GetCoordFromStnList(const std::wstring& name, double& e, double& n, double& z,
@@ -163,7 +171,12 @@ class UNeditDatabase {
     bool CoordsOrderXY() const;
     int GetPointFromPtList(const std::wstring& name, double& e, double& n, double& z,
                            std::wstring& code, unsigned mode) const;
+    /// The first Xyz or Yxz row of that name in the engine's rows, its values in `e`, `n`,
+    /// `z`; gives the row, or -1.
     int FindXYZ(const std::wstring& name, double& e, double& n, double& z);
+    /// The same in other rows.
+    int FindXYZ(const nedit::RowSource& rows, const std::wstring& name, double& e, double& n,
+                double& z);
     int FindRecord(int type, const std::wstring& name);
     std::wstring FormatXYZRecord(const std::wstring& name, double e, double n, double z) const;
     std::wstring FormatBKBRecord(const std::wstring& name, double reading, double bearing) const;
@@ -178,6 +191,11 @@ class UNeditDatabase {
     const std::vector<ULINEBEAR_STRUCT>& GetLineBearings() const { return LineBearings; }
 
     // ---- Reduction --------------------------------------------------------------------
+    /// ProcessCoord's passes, bits that may be combined: the forward observations, which
+    /// position later stations, and the side shots. A run makes both.
+    static constexpr int kForwardPass = 2;
+    static constexpr int kSideShotPass = 4;
+    static constexpr int kAllPasses = kForwardPass | kSideShotPass;
     int ProcessCoord(int passes, int report, int fixedOnly, std::vector<std::wstring>* records);
     /// A station has side shots, points or check shots whose lines the report prints.
     bool HaveSideshotsToReport(const STNSTRUCT* station,
@@ -188,6 +206,8 @@ class UNeditDatabase {
                              double bearing);
 
     // ---- Point, line and arc stores ---------------------------------------------------
+    /// SavePoint's `flags`: the caller is a PT record.
+    static constexpr unsigned kSaveFromPTRecord = 2u;
     unsigned SavePoint(const std::wstring& name, double x, double y, double z, std::wstring code,
                        int ptFlag, unsigned flags, int derived);
     unsigned SaveTravPoint(const std::wstring& name, double x, double y, double z,
@@ -211,18 +231,18 @@ class UNeditDatabase {
     // ---- Derived points back into the rows --------------------------------------------
     /// Writes the adjusted points as XYZ rows behind the marker row, making the marker when
     /// there is none. 1 when rows were written.
-    int SaveAdjustedPt2CtrlList(UListCtrl* list);
+    int SaveAdjustedPt2CtrlList(nedit::RowSource* list);
     /// Writes the addition points (coordinates the user or the job gave) as XYZ rows in the
     /// file's unit above the marker, replacing a row of the same name whose values differ.
-    int SaveAdditionPt2CtrlList(UListCtrl* list);
+    int SaveAdditionPt2CtrlList(nedit::RowSource* list);
     /// Forgets the adjusted points and deletes the rows from the lowest marker down.
     void DelAdjPts();
     void ClearAddPtList();
 
-    const std::vector<UNeditPt>& GetPointList() const { return PointList; }
-    const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList; }
-    const std::vector<UNeditLine>& GetLineList() const { return LineList; }
-    const std::vector<UNeditArc>& GetArcList() const { return ArcList; }
+    const std::vector<UNeditPt>& GetPointList() const { return PointList.Items(); }
+    const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList.Items(); }
+    const std::vector<UNeditLine>& GetLineList() const { return LineList.Items(); }
+    const std::vector<UNeditArc>& GetArcList() const { return ArcList.Items(); }
     const std::vector<UWCircle>& GetCircleList() const { return CircleList; }
 
     /// The messages of the coordinate dialogs go to this host; null answers by default.
@@ -230,6 +250,7 @@ class UNeditDatabase {
 
   private:
     bool AbortRequested() const;
+    void RunStages(nedit::RunStep step);
     void ResetForRerun();
     void AppendStation(std::unique_ptr<STNSTRUCT> station);
     void ResetPassValues();
@@ -242,15 +263,13 @@ class UNeditDatabase {
     void ProcessBkbRecord();
     void ProcessObservation(int type, int recordNo);
     void ApplyDistanceCorrection(MEASSTRUCT& measurement) const;
-    int FindCoordinateRow(const std::wstring& name, bool coordinates, int type, double* e,
-                          double* n, double* z);
+    int FindCoordinateRow(const nedit::RowSource* rows, const std::wstring& name, bool coordinates,
+                          int type, double* e, double* n, double* z);
     void ReplaceRow(int row, const std::wstring& text);
     /// The first node of that exact name, in list order; the others follow by NextSameName.
     STNSTRUCT* FirstNamed(const std::wstring& name) const;
     std::vector<STNSTRUCT*> OccupiedStations(const std::wstring& name,
                                              const STNSTRUCT* observer) const;
-    void RebuildPointIndex();
-    void RebuildLineIndex();
     std::vector<std::wstring> ContentRows() const;
     // Reduction of one station, and of one target with its printing (ProcessCoord.cpp).
     struct StationWork;
@@ -273,12 +292,13 @@ class UNeditDatabase {
     // Collaborators.
     UNeutralFileFormat* Doc;
     UNeditReport* Report = nullptr;
-    UListCtrl* ListCtrl;
+    nedit::RowSource* Rows;
     USurveyDoc* SurveyDoc;
     nedit::DialogHost* Host;
     nedit::ProgressSink* Progress;
     CError ErrorSink;
     std::function<void(int)> AngleTypeHandler;
+    std::vector<nedit::RunStage*> Stages;
     std::wstring FileName;
 
     // Running values of a pass.
@@ -326,18 +346,11 @@ class UNeditDatabase {
     std::unordered_map<std::wstring, std::size_t> BearingIndex;  // "from\x1fto" as stored
 
     // Stores of reduced geometry, with look-ups by name.
-    std::vector<UNeditPt> PointList;
-    NameIndex PointIndex{
-        [this](std::size_t i) -> const std::wstring& { return PointList[i].GetID(); }};
-    std::vector<UNeditPt> AddPtList;
-    NameIndex AddPtIndex{
-        [this](std::size_t i) -> const std::wstring& { return AddPtList[i].GetID(); }};
-    std::vector<UNeditPt> TravPtList;
-    NameIndex TravPtIndex{
-        [this](std::size_t i) -> const std::wstring& { return TravPtList[i].GetID(); }};
-    std::vector<UNeditLine> LineList;
-    std::unordered_map<std::wstring, std::size_t> LineIndex;
-    std::vector<UNeditArc> ArcList;
+    nedit::PointStore PointList;
+    nedit::PointStore AddPtList;
+    nedit::PointStore TravPtList;
+    nedit::LineStore LineList;
+    nedit::ArcStore ArcList;
     std::vector<UWCircle> CircleList;
     double XMin = -1e12, YMin = -1e12, XMax = -1e12, YMax = -1e12;
     unsigned LastPercent = 1000;  // none reported yet

@@ -4,14 +4,14 @@
 #include <cmath>
 #include <ctime>
 
-#include "document/UNeditDoc.h"
 #include "platform/geometry/Tolerance.h"
 #include "platform/geometry/UAngle.h"
 #include "platform/messages/Translate.h"
 #include "platform/text/Format.h"
 #include "platform/text/WideText.h"
-#include "reduction/ObservationModel.h"
+#include "records/UNeutralFileFormat.h"
 #include "report/OutParamStruct.h"
+#include "report/ReportContext.h"
 #include "report/UNeditReport.h"
 
 using nedit::Format;
@@ -70,32 +70,29 @@ void UNeditReport::PrintEdmHead() {
 
 void UNeditReport::PrintMainReportHead() {
     IniCache.clear();
-    if (Doc != nullptr) {
-        SetOutUA(Doc->GetCheckOn(opt::AngleDms));
-        SetOutUL(Doc->GetCheckOn(opt::LengthMetres));
-    }
+    if (Context != nullptr) TakeOutputUnits();
     KeepLines(4);
     W(Translate(L"Main Report"), 2, 2);
-    if (Doc != nullptr) {
-        PrintHeadCtrlString(L"INUL", L"DISTUNIT", Doc->GetFileLengthLetter());
-        PrintHeadCtrlString(L"INUA", L"ANGUNIT", Doc->GetFileAngleLetter());
+    if (Context != nullptr) {
+        PrintHeadCtrlString(L"INUL", L"DISTUNIT", Context->GetRecordFormat().GetFileLengthLetter());
+        PrintHeadCtrlString(L"INUA", L"ANGUNIT", Context->GetRecordFormat().GetFileAngleLetter());
     }
     W(Format(kLabel, GetTitleText(L"OUTUL"), Unit_Text(L"DISTUNIT", OutUL)), 0, 1);
     W(Format(kLabel, GetTitleText(L"OUTUA"), Unit_Text(L"ANGUNIT", OutUA)), 0, 1);
     W(Format(kLabel, GetTitleText(L"TEMP"), Unit_Text(L"MISCUNIT", L'T')), 0, 1);
     W(Format(kLabel, GetTitleText(L"PRES"), Unit_Text(L"MISCUNIT", L'P')), 0, 1);
-    if (Doc != nullptr) {
-        PrintHeadCtrlString(L"HANGMODE", L"HAMODE", Doc->GetHModeLetter());
-        PrintHeadCtrlString(L"VANGMODE", L"VAMODE", Doc->GetVModeLetter());
+    if (Context != nullptr) {
+        PrintHeadCtrlString(L"HANGMODE", L"HAMODE", Context->GetRecordFormat().GetHModeLetter());
+        PrintHeadCtrlString(L"VANGMODE", L"VAMODE", Context->GetRecordFormat().GetVModeLetter());
     }
 }
 
 // ---- Stations and their observations ------------------------------------------------------
 
-void UNeditReport::PrintOccStnBlk(const STNSTRUCT* station, const std::wstring& name, double e,
-                                  double n, double h, const std::wstring& code, double insHt,
-                                  double scale, const std::wstring& backStn, double backBearing,
-                                  double backAngle) {
+void UNeditReport::PrintOccStnBlk(const std::vector<double>& backReadings, const std::wstring& name,
+                                  double e, double n, double h, const std::wstring& code,
+                                  double insHt, double scale, const std::wstring& backStn,
+                                  double backBearing, double backAngle) {
     KeepLines(10);
     NewLines(3);
     PrintHeadString(L"OCCSTN", name);
@@ -106,12 +103,10 @@ void UNeditReport::PrintOccStnBlk(const STNSTRUCT* station, const std::wstring& 
     if (backStn.empty()) return;
     PrintHeadString(L"BACKSTN", backStn);
     PrintHeadHDegree(L"BSBEARING", backBearing, true);
-    if (station != nullptr && !station->BSList.empty()) {
-        bool first = true;
-        for (const MEASSTRUCT& measurement : *station->BSList.front()->Meas) {
-            PrintHeadHDegree(L"BSOBS", measurement.HAng, first);
-            first = false;
-        }
+    bool first = true;
+    for (const double reading : backReadings) {
+        PrintHeadHDegree(L"BSOBS", reading, first);
+        first = false;
     }
     PrintHeadHDegree(L"BSANGLE", backAngle, true);
 }
@@ -131,13 +126,13 @@ void UNeditReport::PrintSSHead() {
         {opt::VD, L"COLVD", L"%8s"},  {opt::HT, L"COLHT", L"%7s"},  XYFlag ? east : north,
         XYFlag ? north : east,        {opt::HC, L"COLHC", L"%10s"}, {opt::CO, L"COLCO", L" %s"},
     };
-    // Without a document the reduced set of columns stands.
+    // Without a context the reduced set of columns stands.
     const int reduced[] = {opt::ID, opt::HA, opt::VA, opt::SD, opt::HT,
                            opt::EC, opt::NC, opt::HC, opt::CO};
     for (const Head& head : heads) {
-        const bool shown = Doc != nullptr ? IsOn(head.option)
-                                          : std::find(std::begin(reduced), std::end(reduced),
-                                                      head.option) != std::end(reduced);
+        const bool shown = Context != nullptr ? IsOn(head.option)
+                                              : std::find(std::begin(reduced), std::end(reduced),
+                                                          head.option) != std::end(reduced);
         if (shown)
             W(Format(head.format, GetTitleText(head.key)), head.option == opt::ID ? 1 : 0, 0);
     }
@@ -151,9 +146,9 @@ void UNeditReport::PrintSSLine(const std::wstring& id, double ha, double va, dou
     const std::wstring vertical = Dist(std::cos(va * kRadiansPerDegree) * sd);
     const std::wstring vertical_angle = dmsString(ConvertToDisplayVA(va));
     const auto [first, second] = InOrder(Dist(e), Dist(n));
-    const bool with_doc = Doc != nullptr;
-    auto column = [&](int option, bool without_doc, const std::wstring& text) {
-        if (with_doc ? IsOn(option) : without_doc) W(text, 0, 0);
+    const bool with_context = Context != nullptr;
+    auto column = [&](int option, bool without_context, const std::wstring& text) {
+        if (with_context ? IsOn(option) : without_context) W(text, 0, 0);
     };
     column(opt::ID, true, Format(L"%7s", id));
     column(opt::LN, false, full ? Format(L"%5d", lineNo) : Format(L"%5c", L' '));
@@ -261,13 +256,16 @@ int UNeditReport::PrintTraverseInfo(double dE, double dN, double dH, double brg,
                                     const std::wstring& accuracy, bool elevError, bool angle,
                                     double angErr, double perStn, double known, double observed) {
     // Lengths here follow the job's settings, not the report's output unit.
-    const UJobSettings job = Doc != nullptr ? Doc->GetSettings() : UJobSettings();
+    const UJobSettings& job = Settings();
     KeepLines(7);
-    const std::wstring east = job.LengthToString(dE, false, false, 3, -1, true, false);
-    const std::wstring north = job.LengthToString(dN, false, false, 3, -1, true, false);
+    using namespace nedit::length;
+    const std::wstring east =
+        job.LengthToString(dE, kNoUnit, kNoSign, 3, kJobInchFraction, kCoordinate, kUnused);
+    const std::wstring north =
+        job.LengthToString(dN, kNoUnit, kNoSign, 3, kJobInchFraction, kCoordinate, kUnused);
     // Heights and areas are in the job's unit already, as the job shows them.
-    const std::wstring height =
-        job.UnitLengthToString(Is_Zero(dH, false) ? 0.0 : dH, false, false, 3, -1, false);
+    const std::wstring height = job.UnitLengthToString(Is_Zero(dH, false) ? 0.0 : dH, kNoUnit,
+                                                       kNoSign, 3, kJobInchFraction, kUnused);
     W(Translate(XYFlag ? L"                               East Diff            North Diff          "
                          L" Elev Diff"
                        : L"                               North Diff           East Diff           "
@@ -282,11 +280,11 @@ int UNeditReport::PrintTraverseInfo(double dE, double dN, double dH, double brg,
     };
     W(Format(L"%s               %-20s %s             %-20s", Translate(L"Misclose Bearing"),
              angle_text(brg), Translate(L"Distance"),
-             job.DistanceToString(dist, false, false, 3, -1, false, false)),
+             job.DistanceToString(dist, kNoUnit, kNoSign, 3, kJobInchFraction, kUnused, kUnused)),
       0, 1);
     W(Format(L"%s                  %-20.3f %s      %-20s", Translate(L"Enclosed Area"),
              area > 0.0 ? area : 0.0, Translate(L"Traverse Length"),
-             job.DistanceToString(length, false, false, 3, -1, false, false)),
+             job.DistanceToString(length, kNoUnit, kNoSign, 3, kJobInchFraction, kUnused, kUnused)),
       0, 1);
     W(Format(L"%s                  %-20d %s             %-20s", Translate(L"No  of Setups"), setups,
              Translate(L"Accuracy"), accuracy),
@@ -331,9 +329,9 @@ void UNeditReport::PrintChkStn(const std::wstring& id, double ha, double va, dou
                                const std::wstring& code, int lineNo) {
     const std::wstring horizontal = Dist(std::fabs(std::sin(va * kRadiansPerDegree) * sd));
     const std::wstring vertical = Dist(std::fabs(std::cos(va * kRadiansPerDegree) * sd));
-    const bool with_doc = Doc != nullptr;
-    auto column = [&](int option, bool without_doc, const std::wstring& text) {
-        if (with_doc ? IsOn(option) : without_doc) W(text, 0, 0);
+    const bool with_context = Context != nullptr;
+    auto column = [&](int option, bool without_context, const std::wstring& text) {
+        if (with_context ? IsOn(option) : without_context) W(text, 0, 0);
     };
     column(opt::ID, true, Format(L"%7s", id));
     column(opt::LN, false, Format(L" %4d", lineNo));

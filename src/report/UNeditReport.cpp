@@ -5,14 +5,16 @@
 
 #include <cmath>
 
-#include "document/UNeditDoc.h"
 #include "platform/format/UFormatAngle.h"
+#include "platform/geometry/CoordinateGeometry.h"
 #include "platform/messages/Translate.h"
 #include "platform/text/Format.h"
 #include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
+#include "records/UNeutralFileFormat.h"
 #include "report/NeditIni.h"
 #include "report/OutParamStruct.h"
+#include "report/ReportContext.h"
 
 namespace {
 
@@ -57,15 +59,16 @@ bool IsUsFeet(wchar_t unit) {
 
 }  // namespace
 
-UNeditReport::UNeditReport(UNeditDoc* doc, const std::wstring& title) : UReportDoc(title) {
-    Init(doc, title);
+UNeditReport::UNeditReport(const nedit::ReportContext* context, const std::wstring& title)
+    : UReportDoc(title) {
+    Init(context, title);
 }
 
 UNeditReport::~UNeditReport() = default;
 
-void UNeditReport::Init(UNeditDoc* doc, const std::wstring& title) {
+void UNeditReport::Init(const nedit::ReportContext* context, const std::wstring& title) {
     SetReportTitle(title);
-    Doc = doc;
+    Context = context;
     EdmScale = 1.0;
     EdmType = L'0';
     OutUA = L'S';
@@ -84,10 +87,15 @@ void UNeditReport::Clear() {
 }
 
 void UNeditReport::UpdateSettings() {
-    if (Doc == nullptr) return;
-    SetOutUA(Doc->GetCheckOn(opt::AngleDms));
-    SetOutUL(Doc->GetCheckOn(opt::LengthMetres));
-    XYFlag = Doc->IsENOrder() ? 1 : 0;
+    if (Context == nullptr) return;
+    TakeOutputUnits();
+    XYFlag = Context->IsENOrder() ? 1 : 0;
+}
+
+void UNeditReport::TakeOutputUnits() {
+    const OutParamStruct& parameters = Context->GetOutputParameters();
+    SetOutUA(GetCheckOn(parameters, opt::AngleDms));
+    SetOutUL(GetCheckOn(parameters, opt::LengthMetres));
 }
 
 void UNeditReport::SetOutUA(int unit) {
@@ -120,7 +128,7 @@ std::wstring UNeditReport::Unit_Text(const std::wstring& section, wchar_t letter
 
 const UJobSettings& UNeditReport::Settings() const {
     static const UJobSettings kDefaults;
-    return Doc != nullptr ? Doc->GetSettings() : kDefaults;
+    return Context != nullptr ? Context->GetSettings() : kDefaults;
 }
 
 double UNeditReport::ToMetres(double length) const {
@@ -143,7 +151,9 @@ std::wstring UNeditReport::ConvertToDistDisplayUnit(double length, int decimals)
         feet.SetFootFormat(Settings().GetFootFormat());
         feet.SetFootInchPrecision(Settings().GetFootInchPrecision());
         feet.SetLengthUnit(nedit::LengthUnit::Feet);
-        return feet.UnitLengthToString(value, false, false, -1, -1, false);
+        using namespace nedit::length;
+        return feet.UnitLengthToString(value, kNoUnit, kNoSign, kJobDecimals, kJobInchFraction,
+                                       kUnused);
     }
     return nedit::Format(L"%.*f", decimals, value);
 }
@@ -164,8 +174,8 @@ double UNeditReport::ConvertToAngleDisplayUnit(double degrees) const {
 }
 
 double UNeditReport::ConvertToDisplayVA(double reading) const {
-    if (Doc == nullptr) return 0.0;
-    return ConvertToAngleDisplayUnit(Doc->ConvertToZenithVA(reading));
+    if (Context == nullptr) return 0.0;
+    return ConvertToAngleDisplayUnit(Context->GetRecordFormat().ConvertToZenithVA(reading));
 }
 
 double UNeditReport::dms(double degrees) {
@@ -213,7 +223,6 @@ std::wstring UNeditReport::deg2dmsString(double degrees) {
 }
 
 int UNeditReport::AngleType() const {
-    if (Doc != nullptr) return Doc->GetCheckOn(opt::AngleDms);
     if (OutUA == L'1' || OutUA == L'D') return 1;
     if (OutUA == L'2' || OutUA == L'G') return 2;
     return 0;
@@ -234,23 +243,15 @@ std::wstring UNeditReport::FormatAngle(double degrees) const {
 
 void UNeditReport::geo_brgdst(double e1, double n1, double e2, double n2, double* brg,
                               double* dst) {
-    const double de = e2 - e1;
-    const double dn = n2 - n1;
-    *dst = std::sqrt(dn * dn + de * de);
-    if (std::fabs(dn) <= 1e-5) {
-        *brg = de < 0.0 ? 270.0 : de > 0.0 ? 90.0 : 0.0;
-        return;
-    }
-    *brg = std::atan2(de, dn) * 57.29577951308232;
-    if (*brg < 0.0) *brg += 360.0;
+    nedit::geo_brgdst(e1, n1, e2, n2, brg, dst);
 }
 
 int UNeditReport::geo_zero(double value) {
-    return std::fabs(value) <= 1e-5 ? 1 : 0;
+    return nedit::geo_zero(value);
 }
 
 bool UNeditReport::IsOn(int option) const {
-    return Doc != nullptr && Doc->GetCheckOn(option) != 0;
+    return Context != nullptr && GetCheckOn(Context->GetOutputParameters(), option) != 0;
 }
 
 std::wstring UNeditReport::Height(double value) {

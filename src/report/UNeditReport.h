@@ -4,29 +4,31 @@
 // the user chose, and writes every block of the report in its fixed-width layout.
 //
 // Stored lengths are in the job's unit and angles in decimal degrees; the output units come
-// from the document's report parameters each time a head is printed.
+// from the report parameters of its context (the document) each time a head is printed.
 
 #include <map>
 #include <memory>
 #include <string>
 #include <utility>
+#include <vector>
 
 #include "platform/job/UJobSettings.h"
 #include "platform/report/UReportDoc.h"
 
-class UNeditDoc;
-struct STNSTRUCT;
+namespace nedit {
+class ReportContext;
+}
 
 class UNeditReport : public UReportDoc {
   public:
-    UNeditReport(UNeditDoc* doc, const std::wstring& title);
+    UNeditReport(const nedit::ReportContext* context, const std::wstring& title);
     ~UNeditReport() override;
 
-    /// Binds the report to `doc` (may be null) and takes its output units and order. The page
-    /// length is PAGELENGTH of section REPORT of NEDIT.INI when set, else 66 lines.
-    void Init(UNeditDoc* doc, const std::wstring& title);
+    /// Binds the report to `context` (may be null) and takes its output units and order. The
+    /// page length is PAGELENGTH of section REPORT of NEDIT.INI when set, else 66 lines.
+    void Init(const nedit::ReportContext* context, const std::wstring& title);
     void Clear() override;
-    /// Takes the output units and coordinate order from the document; nothing without one.
+    /// Takes the output units and coordinate order from the context; nothing without one.
     void UpdateSettings();
     /// 0, 1, 2 give 'S', 'D', 'G' (angles) and 'M', 'F', 'U' (lengths); others change nothing.
     void SetOutUA(int unit);
@@ -36,7 +38,6 @@ class UNeditReport : public UReportDoc {
     void SetHeaderOutputed(bool printed) { HeaderOutputed = printed; }
     wchar_t GetOutUA() const { return OutUA; }
     wchar_t GetOutUL() const { return OutUL; }
-    UNeditDoc* GetDoc() const { return Doc; }
 
     // ---- Texts and values -------------------------------------------------------------
     /// A label of section TITLE of NEDIT.INI, or its default; empty for a key without one.
@@ -57,9 +58,10 @@ class UNeditReport : public UReportDoc {
     static std::wstring deg2dmsString(double degrees);
     /// A horizontal angle or bearing in the output angle type: "123 45'30"" or "123.7583".
     std::wstring FormatAngle(double degrees) const;
-    /// Bearing (degrees) and distance from (e1, n1) to (e2, n2).
+    /// The platform's nedit::geo_brgdst: bearing (degrees) and distance from (e1, n1) to
+    /// (e2, n2).
     static void geo_brgdst(double e1, double n1, double e2, double n2, double* brg, double* dst);
-    /// 1 when the size of `value` is 1e-5 or less.
+    /// The platform's nedit::geo_zero: 1 when the size of `value` is 1e-5 or less.
     static int geo_zero(double value);
 
     // ---- Blocks -------------------------------------------------------------------------
@@ -72,8 +74,10 @@ class UNeditReport : public UReportDoc {
     void PrintHeadString(const std::wstring& key, const std::wstring& value);
     void PrintHeadCoord(double e, double n, double h);
     void PrintEdmHead();
-    void PrintOccStnBlk(const STNSTRUCT* station, const std::wstring& name, double e, double n,
-                        double h, const std::wstring& code, double insHt, double scale,
+    /// The block of an occupied station. `backReadings` are the horizontal circle readings of
+    /// its back sight, each round as read; they are printed only with a back station.
+    void PrintOccStnBlk(const std::vector<double>& backReadings, const std::wstring& name, double e,
+                        double n, double h, const std::wstring& code, double insHt, double scale,
                         const std::wstring& backStn, double backBearing, double backAngle);
     void PrintSSHead();
     void PrintSSLine(const std::wstring& id, double ha, double va, double sd, double ht, double e,
@@ -107,6 +111,8 @@ class UNeditReport : public UReportDoc {
     void PrintPageHead(const std::wstring& text, int page);
 
   private:
+    /// OutUA and OutUL from the context's report parameters; needs a context.
+    void TakeOutputUnits();
     /// W of the report's notation: line ends before, the text, line ends after.
     void W(const std::wstring& text, int before, int after) { WriteText(text, before, after, 0); }
     std::wstring Dist(double value) { return ConvertToDistDisplayUnit(value, 3); }
@@ -114,7 +120,7 @@ class UNeditReport : public UReportDoc {
     bool IsOn(int option) const;
     int AngleType() const;
     bool Sexagesimal() const;
-    /// The document's job settings, as they are now; defaults without a document.
+    /// The context's job settings, as they are now; defaults without a context.
     const UJobSettings& Settings() const;
     /// Metres of a stored length in the job's unit.
     double ToMetres(double length) const;
@@ -122,7 +128,7 @@ class UNeditReport : public UReportDoc {
     /// East and North texts in the order of XYFlag.
     std::pair<std::wstring, std::wstring> InOrder(std::wstring east, std::wstring north) const;
 
-    UNeditDoc* Doc = nullptr;
+    const nedit::ReportContext* Context = nullptr;
     double EdmScale = 1.0;
     wchar_t EdmType = L'0';
     wchar_t OutUA = L'S';

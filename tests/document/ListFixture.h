@@ -9,10 +9,10 @@
 #include <vector>
 
 #include "../records/RecordFixture.h"
+#include "../support/HeadlessDialogHost.h"
 #include "document/ListInterfaces.h"
 #include "document/MemoryClipboard.h"
 #include "document/UListCtrl.h"
-#include "platform/messages/HeadlessDialogHost.h"
 
 class FakeRecordForm : public URecordForm {
   public:

@@ -4,11 +4,11 @@
 
 #include <fstream>
 
+#include "../support/HeadlessDialogHost.h"
 #include "../support/TestSupport.h"
 #include "document/UListCtrl.h"
 #include "document/URawDataContainer.h"
 #include "platform/job/USurveyDoc.h"
-#include "platform/messages/HeadlessDialogHost.h"
 #include "platform/storage/UStreamFile.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "reduction/UNeditDatabase.h"
@@ -98,8 +98,7 @@ TEST_F(RawDataDocuments, AReductionAddsTheCoordinatesItWasGiven) {
               1);
     UNeditDoc* doc = container->GetNeditDoc(L"Data1");
     nedit::HeadlessDialogHost host;
-    host.SetDialogScript(L"Control Point Coordinate", [](nedit::UDialogLogic& logic) {
-        auto& dialog = static_cast<UCoordEntryDlg&>(logic);
+    host.SetFace<UCoordEntryDlg>([](UCoordEntryDlg& dialog) {
         dialog.InitXYZ(100.0, 200.0, 30.0, L"");
         return dialog.OnOK() ? nedit::mb::IdOk : nedit::mb::IdCancel;
     });

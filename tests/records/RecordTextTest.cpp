@@ -22,15 +22,32 @@ TEST(RecordText, ReplaceTokenKeepsEverythingElse) {
     EXPECT_EQ(ReplaceToken(L"STN       ID=A,HI=1", 0, L"ID=B"), L"STN       ID=B,HI=1");
 }
 
-TEST(RecordText, IdTextAndAngleType) {
+TEST(RecordText, IdText) {
     EXPECT_EQ(GetIdText(L"STN       ID=P1,HI=1.500,CO=STN"), L"ID=P1");
     EXPECT_EQ(GetIdText(L"BKB       ID=D,BRG=45.0000"), L"ID=D");
     EXPECT_EQ(GetIdText(L"STN       ID=P1"), L"ID=P1");
     EXPECT_EQ(GetIdText(L"STN"), L"");
-    EXPECT_EQ(GetAngleType(L"UNIT      UL=M,UA=D"), 1);
-    EXPECT_EQ(GetAngleType(L"UNIT      UL=M,UA= 2"), 2);
-    EXPECT_EQ(GetAngleType(L"UNIT      UA=G,UL=F"), 2);
-    EXPECT_EQ(GetAngleType(L"UNIT      UL=M,UA=S"), 0);
-    EXPECT_EQ(GetAngleType(L"UNIT      UL=M"), 0);
-    EXPECT_EQ(GetAngleType(L"UNIT      UA="), 0);
+}
+
+namespace {
+
+struct AngleTypeCase {
+    const wchar_t* row;
+    int type;
+};
+
+class AngleTypeOfARow : public ::testing::TestWithParam<AngleTypeCase> {};
+
+}  // namespace
+
+INSTANTIATE_TEST_SUITE_P(UnitRows, AngleTypeOfARow,
+                         ::testing::Values(AngleTypeCase{L"UNIT      UL=M,UA=D", 1},
+                                           AngleTypeCase{L"UNIT      UL=M,UA= 2", 2},
+                                           AngleTypeCase{L"UNIT      UA=G,UL=F", 2},
+                                           AngleTypeCase{L"UNIT      UL=M,UA=S", 0},
+                                           AngleTypeCase{L"UNIT      UL=M", 0},
+                                           AngleTypeCase{L"UNIT      UA=", 0}));
+
+TEST_P(AngleTypeOfARow, IsTheUnitOfItsUAField) {
+    EXPECT_EQ(GetAngleType(GetParam().row), GetParam().type);
 }

@@ -59,8 +59,7 @@ TEST_F(CoordLookup, SetCoordWritesEveryNodeOfTheNameOrMakesAPointNode) {
 
 TEST_F(CoordLookup, AFieldCoordinateIsConfirmedOnceThenRemembered) {
     int shown = 0;
-    host.SetDialogScript(L"Control Point Coordinate", [&](nedit::UDialogLogic& dialog_logic) {
-        auto& dialog = static_cast<UCoordEntryDlg&>(dialog_logic);
+    host.SetFace<UCoordEntryDlg>([&](UCoordEntryDlg& dialog) {
         ++shown;
         EXPECT_TRUE(dialog.IsOffered(UCoordEntryDlg::Source::Field));
         EXPECT_FALSE(dialog.IsOffered(UCoordEntryDlg::Source::Database));

@@ -32,8 +32,7 @@ class JobSource : public ReductionFixture {
 
 TEST_F(JobSource, TheJobsPointIsOfferedFirstAndRememberedOnceTaken) {
     int shown = 0;
-    host.SetDialogScript(L"Control Point Coordinate", [&](nedit::UDialogLogic& logic) {
-        auto& dialog = static_cast<UCoordEntryDlg&>(logic);
+    host.SetFace<UCoordEntryDlg>([&](UCoordEntryDlg& dialog) {
         ++shown;
         // The job and the field record both know CP1: the job's source is selected, and the
         // other row shows the record's values.

@@ -5,8 +5,8 @@
 #include <vector>
 
 #include "../records/RecordFixture.h"
-#include "document/UListCtrl.h"
-#include "platform/messages/HeadlessDialogHost.h"
+#include "../records/RowList.h"
+#include "../support/HeadlessDialogHost.h"
 #include "reduction/UNeditDatabase.h"
 
 namespace {
@@ -38,7 +38,7 @@ class LoadNeFile : public RecordFixture {
         return texts;
     }
 
-    UListCtrl list{&format};
+    nedit::test::RowList list{&format};
     nedit::HeadlessDialogHost host;
     UNeditDatabase engine{&format, &list, nullptr, &host};
 };

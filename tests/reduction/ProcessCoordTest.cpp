@@ -122,8 +122,7 @@ TEST_F(Reduction, ForwardObservationsPositionLaterStations) {
 }
 
 TEST_F(Reduction, AStationNobodyKnowsIsPositionedByTheUsersAnswer) {
-    host.SetDialogScript(L"Control Point Coordinate", [](nedit::UDialogLogic& shown) {
-        auto& dialog = static_cast<UCoordEntryDlg&>(shown);
+    host.SetFace<UCoordEntryDlg>([](UCoordEntryDlg& dialog) {
         EXPECT_FALSE(dialog.IsOffered(UCoordEntryDlg::Source::Database));
         EXPECT_FALSE(dialog.IsOffered(UCoordEntryDlg::Source::Field));
         EXPECT_EQ(dialog.GetSelectedSource(), UCoordEntryDlg::Source::Enter);
@@ -148,8 +147,7 @@ TEST_F(Reduction, AStationNobodyKnowsIsPositionedByTheUsersAnswer) {
 }
 
 TEST_F(Reduction, CancellingTheCoordinateDialogEndsTheRun) {
-    host.SetDialogScript(L"Control Point Coordinate",
-                         [](nedit::UDialogLogic&) { return nedit::mb::IdCancel; });
+    host.SetFace<UCoordEntryDlg>([](UCoordEntryDlg&) { return nedit::mb::IdCancel; });
     Rows(L"#VERSION-1.0 NEUTRAL FILE\nSTN ID=K\nSS ID=Q,HA=0,VA=90,SD=5,HT=0\n");
     EXPECT_EQ(engine.Process(), 0);
     EXPECT_EQ(engine.GetPointIdx(L"Q"), -1);

@@ -7,8 +7,8 @@
 #include <string>
 
 #include "../records/RecordFixture.h"
-#include "document/UListCtrl.h"
-#include "platform/messages/HeadlessDialogHost.h"
+#include "../records/RowList.h"
+#include "../support/HeadlessDialogHost.h"
 #include "reduction/UNeditDatabase.h"
 
 class ReductionFixture : public RecordFixture {
@@ -38,7 +38,7 @@ class ReductionFixture : public RecordFixture {
         EXPECT_NEAR(point.z, h, tolerance) << "Height of " << std::string(name.begin(), name.end());
     }
 
-    UListCtrl list{&format};
+    nedit::test::RowList list{&format};
     nedit::HeadlessDialogHost host;
     UNeditDatabase engine{&format, &list, nullptr, &host};
 };

@@ -36,12 +36,38 @@ TEST_F(ReductionRun, ExtentsCoverThePointsWithAMargin) {
     EXPECT_DOUBLE_EQ(box.GetMaxY(), 50.5);
 }
 
-TEST(RunErrors, TheErrorTableNamesEachCode) {
-    EXPECT_EQ(CError::MessageOf(-11), L"");
-    EXPECT_EQ(CError::MessageOf(-4), L"MEASUREMENT NOT AVERAGE!!!!");
-    EXPECT_EQ(CError::MessageOf(34702), L"Invalid or empty traverse route !");
-    EXPECT_EQ(CError::MessageOf(1), L"Default Error Has Occurred!!!!");
-    EXPECT_EQ(CError::MessageOf(-1), L"Default Error Has Occurred!!!!");
+namespace {
+
+struct ErrorRow {
+    int code;
+    const wchar_t* message;
+};
+
+class RunErrors : public ::testing::TestWithParam<ErrorRow> {};
+
+}  // namespace
+
+// The error table, row by row; codes it does not name give the default message.
+INSTANTIATE_TEST_SUITE_P(
+    ErrorTable, RunErrors,
+    ::testing::Values(ErrorRow{0, L""}, ErrorRow{-11, L""},
+                      ErrorRow{-10, L"INITIALIZING REDUCE PARAMETERS ERROR!!!!"},
+                      ErrorRow{-9, L"TRAVERSE STN LIST ERROR!!!!"},
+                      ErrorRow{-8, L"TRAVERSE STN LESS THAN 2!!!!"},
+                      ErrorRow{-7, L"NO TRAVERSE ROUTE DEFINE!!!!"},
+                      ErrorRow{-6, L"FORWARD STN DOES NOT EXIST!!!!"},
+                      ErrorRow{-5, L"OCC.STN DOES NOT EXIST!!!!"},
+                      ErrorRow{-4, L"MEASUREMENT NOT AVERAGE!!!!"},
+                      ErrorRow{-3, L"Route NOT FOUND!!!!"}, ErrorRow{-2, L"Save Survey Data File"},
+                      ErrorRow{34701, L"Invalid angle-checking point !"},
+                      ErrorRow{34702, L"Invalid or empty traverse route !"},
+                      ErrorRow{1, L"Default Error Has Occurred!!!!"},
+                      ErrorRow{-1, L"Default Error Has Occurred!!!!"},
+                      ErrorRow{-12, L"Default Error Has Occurred!!!!"},
+                      ErrorRow{34703, L"Default Error Has Occurred!!!!"}));
+
+TEST_P(RunErrors, TheErrorTableNamesEachCode) {
+    EXPECT_EQ(CError::MessageOf(GetParam().code), GetParam().message);
 }
 
 TEST_F(ReductionRun, ASecondRunOnOneEngineGivesTheSameResult) {

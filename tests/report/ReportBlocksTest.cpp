@@ -2,33 +2,19 @@
 
 #include "ReportFixture.h"
 #include "platform/job/USurveyDoc.h"
-#include "reduction/ObservationModel.h"
 #include "report/OutParamStruct.h"
 
 namespace {
 
 using Report = ReportFixture;
 
-STNSTRUCT StationWithBackSight() {
-    STNSTRUCT station;
-    auto back = std::make_unique<SSSTRUCT>();
-    back->SSName = L"B";
-    MEASSTRUCT face1;
-    face1.HAng = 0.0;
-    MEASSTRUCT face2;
-    face2.HAng = 180.0 + 10.0 / 3600.0;  // 180°00'10"
-    back->Meas->push_back(face1);
-    back->Meas->push_back(face2);
-    station.BSList.Append(std::move(back));
-    return station;
-}
-
 }  // namespace
 
 TEST_F(Report, StationBlockWithTwoRoundsAndOffsets) {
     Open(std::string("[OUTPUT]\nORDER=ID LN HA VA SD HT EC NC HC CO\n") + kTitles);
-    const STNSTRUCT station = StationWithBackSight();
-    report->PrintOccStnBlk(&station, L"A", 1000.0, 2000.0, 50.0, L"STN", 1.55, 1.0, L"B", 45.0,
+    // The back sight read 0°00'00" and, face 2, 180°00'10".
+    const std::vector<double> back_readings = {0.0, 180.0 + 10.0 / 3600.0};
+    report->PrintOccStnBlk(back_readings, L"A", 1000.0, 2000.0, 50.0, L"STN", 1.55, 1.0, L"B", 45.0,
                            5.0 / 3600.0);
     report->PrintSSHead();
     // Two rounds of P1, face 1 and face 2, printed as read, then their mean and its offsets.

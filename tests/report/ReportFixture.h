@@ -1,5 +1,5 @@
 #pragma once
-// A report on a document whose NEDIT.INI lies in a temporary configuration directory.
+// A report on a context whose NEDIT.INI lies in a temporary configuration directory.
 
 #include <gtest/gtest.h>
 
@@ -9,15 +9,43 @@
 #include <vector>
 
 #include "../support/TestSupport.h"
-#include "document/UNeditDoc.h"
+#include "platform/job/USurveyDoc.h"
+#include "platform/units/Units.h"
+#include "records/UNeutralFileFormat.h"
+#include "report/NeditIni.h"
+#include "report/ReportContext.h"
 #include "report/UNeditReport.h"
+
+/// What a raw-data document gives its report: the job's settings and units, the columns of
+/// NEDIT.INI's ORDER key, and a record service.
+class TestReportContext : public nedit::ReportContext, public UNeutralFileFormat {
+  public:
+    explicit TestReportContext(USurveyDoc* job) : UNeutralFileFormat(&settings) {
+        if (job != nullptr) settings = job->GetSettings();
+        SetFlagsFromOrder(parameters, nedit::ReadOrderKey());
+        parameters.AngularUnit = nedit::IndexOf(settings.GetAngleUnit());
+        parameters.LinearUnit = nedit::IndexOf(settings.GetLengthUnit());
+    }
+
+    OutParamStruct& GetOutputParameters() { return parameters; }
+    const OutParamStruct& GetOutputParameters() const override { return parameters; }
+    bool IsENOrder() const override {
+        return settings.GetCoordinateOrder() == UJobSettings::kEastNorth;
+    }
+    const UJobSettings& GetSettings() const override { return settings; }
+    const UNeutralFileFormat& GetRecordFormat() const override { return *this; }
+
+  private:
+    UJobSettings settings;
+    OutParamStruct parameters;
+};
 
 class ReportFixture : public ::testing::Test {
   protected:
-    /// A document and report reading `ini` as NEDIT.INI; pages are endless.
+    /// A context and report reading `ini` as NEDIT.INI; pages are endless.
     void Open(const std::string& ini, USurveyDoc* job = nullptr) {
         config.Write("NEDIT.INI", ini);
-        doc = std::make_unique<UNeditDoc>(job);
+        doc = std::make_unique<TestReportContext>(job);
         report = std::make_unique<UNeditReport>(doc.get(), L"Raw Data Reduction Report");
         report->SetPageLength(0);
     }
@@ -31,7 +59,7 @@ class ReportFixture : public ::testing::Test {
 
     nedit::test::TempDir config;
     nedit::test::ScopedEnv env{"SXNEDIT_CONFIG", config.Path()};
-    std::unique_ptr<UNeditDoc> doc;
+    std::unique_ptr<TestReportContext> doc;
     std::unique_ptr<UNeditReport> report;
 };
 

@@ -1,14 +1,11 @@
 // The report's conversions of stored values to output text.
 
-#include <sys/stat.h>
-
 #include <cmath>
 
 #include "ReportFixture.h"
 #include "platform/job/USurveyDoc.h"
 #include "report/NeditIni.h"
 #include "report/OutParamStruct.h"
-#include "report/UOutputParamDlg.h"
 
 namespace {
 using ReportValues = ReportFixture;
@@ -118,41 +115,15 @@ TEST(ReportParameters, TheOrderKeyTurnsColumnsOnByToken) {
     EXPECT_EQ(GetCheckOn(parameters, 2000), 0);
 }
 
-TEST_F(ReportValues, TheParameterDialogStoresTheColumnsAndKeepsThePageSize) {
-    Open("[OUTPUT]\nORDER=HC SD\n");
-    OutParamStruct& parameters = doc->GetOutputParameters();
-    EXPECT_EQ(parameters.OutHC, 1);
-    EXPECT_EQ(parameters.OutID, 0);
-    parameters.LinearUnit = 2;
-    UOutputParamDlg dialog(parameters);
-    EXPECT_EQ(dialog.LinearRadio, 1);  // US feet show as feet
-    dialog.SetChecked(opt::ID, true);
-    dialog.SetChecked(opt::SD, false);
-    dialog.AngularRadio = 1;
-    ASSERT_TRUE(dialog.OnOK());
-    EXPECT_EQ(dialog.GetParameters().LinearUnit, 1);
-    EXPECT_EQ(dialog.GetParameters().AngularUnit, 1);
-    EXPECT_EQ(dialog.GetParameters().PageSize, 55);
-    EXPECT_EQ(nedit::ReadOrderKey(), L"ID HC ");
-    // A second document reads what the dialog wrote.
-    UNeditDoc second(nullptr);
-    EXPECT_EQ(second.GetCheckOn(opt::ID), 1);
-    EXPECT_EQ(second.GetCheckOn(opt::SD), 0);
-}
-
-TEST_F(ReportValues, NeditIniStaysWritableWhileADocumentLives) {
-    Open("[OUTPUT]\nORDER=ID\n");
-    doc.reset();
-    report.reset();
-    const std::string path = config.File("NEDIT.INI");
-    ASSERT_EQ(chmod(path.c_str(), 0444), 0);
-    {
-        UNeditDoc open(nullptr);
-        struct stat info {};
-        ASSERT_EQ(stat(path.c_str(), &info), 0);
-        EXPECT_NE(info.st_mode & S_IWUSR, 0u);
-    }
-    struct stat info {};
-    ASSERT_EQ(stat(path.c_str(), &info), 0);
-    EXPECT_EQ(info.st_mode & 0777, 0444u);
+TEST_F(ReportValues, AnglesOfOneHeadShareOneUnit) {
+    Open("");
+    // The parameters change after the head took its units: every angle of the block stays in
+    // the units of the head, until the next head takes the new ones.
+    doc->GetOutputParameters().AngularUnit = 2;
+    EXPECT_EQ(report->FormatAngle(90.0), L"90 00'00\"");
+    EXPECT_DOUBLE_EQ(report->ConvertToAngleDisplayUnit(90.0), 90.0);
+    EXPECT_EQ(report->dmsString(report->ConvertToAngleDisplayUnit(90.0)), L" 90 00'00\"");
+    report->UpdateSettings();
+    EXPECT_EQ(report->FormatAngle(90.0), L"100.0000");
+    EXPECT_EQ(report->dmsString(report->ConvertToAngleDisplayUnit(90.0)), L"100.0000");
 }

@@ -40,6 +40,18 @@ double AskNumber(const std::string& answer, double fallback) {
 
 }  // namespace
 
+ConsoleDialogHost::ConsoleDialogHost(bool interactive, bool echo)
+    : Interactive(interactive), Echo(echo) {
+    SetFace<UCoordEntryDlg>([this](UCoordEntryDlg& dialog) {
+        if (Interactive) return AskCoordinates(dialog);
+        dialog.SetApplyToAll(true);
+        return Accept(dialog);
+    });
+    SetFace<UBKBCoordDlg>([this](UBKBCoordDlg& dialog) {
+        return Interactive ? AskBackStation(dialog) : Accept(dialog);
+    });
+}
+
 int ConsoleDialogHost::ShowMessage(const std::wstring& text, unsigned flags, unsigned /*help*/) {
     MessagesShown.push_back(text);
     if (Interactive) return AskMessage(text, flags);
@@ -47,17 +59,9 @@ int ConsoleDialogHost::ShowMessage(const std::wstring& text, unsigned flags, uns
     return nedit::mb::DefaultAnswer(flags);
 }
 
-int ConsoleDialogHost::RunDialog(nedit::UDialogLogic& dialog) {
+int ConsoleDialogHost::Show(nedit::UDialogLogic& dialog, const Face* face) {
     dialog.OnInitDialog();
-    if (auto* coordinates = dynamic_cast<UCoordEntryDlg*>(&dialog)) {
-        if (Interactive) return AskCoordinates(*coordinates);
-        coordinates->SetApplyToAll(true);
-    } else if (auto* back = dynamic_cast<UBKBCoordDlg*>(&dialog); back != nullptr && Interactive) {
-        return AskBackStation(*back);
-    }
-    if (dialog.OnOK()) return nedit::mb::IdOk;
-    dialog.OnCancel();
-    return nedit::mb::IdCancel;
+    return face != nullptr ? (*face)(dialog) : Accept(dialog);
 }
 
 std::string ConsoleDialogHost::ReadAnswer(const std::string& prompt) {

@@ -3,6 +3,8 @@
 // coordinates come from the job if it offers them, else from the field records, else the
 // entered values; every message box takes its default button. With `interactive` it asks
 // on the terminal instead. Every message shown is kept, in order, for the JSON output.
+// It has faces for the coordinate and back-bearing dialogs; every other dialog is accepted
+// as it stands.
 
 #include <cstdio>
 #include <string>
@@ -16,15 +18,16 @@ class UCoordEntryDlg;
 class ConsoleDialogHost : public nedit::DialogHost {
   public:
     /// `echo` prints each message on standard error as it is shown.
-    explicit ConsoleDialogHost(bool interactive = false, bool echo = true)
-        : Interactive(interactive), Echo(echo) {}
+    explicit ConsoleDialogHost(bool interactive = false, bool echo = true);
 
     int ShowMessage(const std::wstring& text, unsigned flags, unsigned help) override;
-    int RunDialog(nedit::UDialogLogic& dialog) override;
 
     void SetInteractive(bool interactive) { Interactive = interactive; }
     void SetEcho(bool echo) { Echo = echo; }
     const std::vector<std::wstring>& Messages() const { return MessagesShown; }
+
+  protected:
+    int Show(nedit::UDialogLogic& dialog, const Face* face) override;
 
   private:
     int AskMessage(const std::wstring& text, unsigned flags);

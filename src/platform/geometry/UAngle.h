@@ -7,6 +7,8 @@ class UWPoint;
 
 /// Degrees to radians; the factor the field programs use.
 inline constexpr double kRadiansPerDegree = 0.017453292519943295;
+/// Radians to degrees; the factor the field programs use.
+inline constexpr double kDegreesPerRadian = 57.29577951308232;
 
 /// An angle held in degrees.
 class UAngle {

@@ -1,9 +1,80 @@
-// Lines, arcs and circles: objects that hang on points of the job.
+// Lines, arcs and circles: objects that hang on points of the job, and the style columns that
+// they and the polylines share.
+#include <iterator>
+#include <string>
+
 #include "platform/job/JobDatabase.h"
 #include "platform/job/UDBArc.h"
 #include "platform/job/UDBCircle.h"
 #include "platform/job/UDBLine.h"
 #include "platform/job/USurveyDoc.h"
+
+// ---- UDBLinework -----------------------------------------------------------------------
+
+namespace {
+
+// The style columns in their order.
+constexpr const char* kStyleColumns[] = {"layer_id", "colour", "line_style", "thickness", "flags"};
+constexpr int kStyleCount = static_cast<int>(std::size(kStyleColumns));
+
+// The kind's own columns, then the style columns, each as `item` writes it, with ", " between.
+template <class Item>
+std::string EveryColumn(std::initializer_list<const char*> own, Item item) {
+    std::string text;
+    auto add = [&text](const std::string& piece) { text += (text.empty() ? "" : ", ") + piece; };
+    for (const char* column : own) add(item(column));
+    for (const char* column : kStyleColumns) add(item(column));
+    return text;
+}
+
+}  // namespace
+
+bool UDBLinework::LoadRow(long id, std::initializer_list<const char*> columns,
+                          const ReadColumns& read) {
+    if (id == 0 || nedit::ObjectKindOf(id) != kind_) return false;
+    // A row without a layer reads as layer 0.
+    const std::string selected = EveryColumn(columns, [](const std::string& column) {
+        return column == "layer_id" ? "coalesce(layer_id, 0)" : column;
+    });
+    auto query = Job().Query("SELECT " + selected + " FROM " + table_ + " WHERE id = ?");
+    query->Bind(1, id);
+    if (!query->Step()) return false;
+    id_ = id;
+    read(*query);
+    const int first = static_cast<int>(columns.size());
+    layer_ = static_cast<long>(query->Int(first));
+    colour_ = static_cast<int>(query->Int(first + 1));
+    line_style_ = static_cast<int>(query->Int(first + 2));
+    thickness_ = static_cast<int>(query->Int(first + 3));
+    flags_ = static_cast<unsigned>(query->Int(first + 4));
+    return true;
+}
+
+void UDBLinework::SaveRow(std::initializer_list<const char*> columns, const BindColumns& bind) {
+    const std::string table = table_;
+    std::string sql;
+    if (id_ == 0) {
+        const std::string names =
+            EveryColumn(columns, [](const std::string& name) { return name; });
+        const std::string marks =
+            EveryColumn(columns, [](const std::string&) { return std::string("?"); });
+        sql = "INSERT INTO " + table + " (" + names + ") VALUES (" + marks + ")";
+    } else {
+        const std::string assignments =
+            EveryColumn(columns, [](const std::string& name) { return name + " = ?"; });
+        sql = "UPDATE " + table + " SET " + assignments + " WHERE id = ?";
+    }
+    nedit::JobDatabase& job = Job();
+    auto write = job.Query(sql);
+    bind(*write);
+    const int first = static_cast<int>(columns.size()) + 1;
+    write->BindOptionalId(first, layer_);
+    write->Bind(first + 1, colour_).Bind(first + 2, line_style_).Bind(first + 3, thickness_);
+    write->Bind(first + 4, static_cast<long long>(flags_));
+    if (id_ != 0) write->Bind(first + kStyleCount, id_);
+    write->Run();
+    if (id_ == 0) id_ = static_cast<long>(job.LastInsertId());
+}
 
 // ---- UDBLine ---------------------------------------------------------------------------
 
@@ -12,40 +83,17 @@ UDBLine::UDBLine(USurveyDoc* job, long id) : UDBLinework(job, nedit::kLineKind, 
 }
 
 bool UDBLine::Load(long id) {
-    if (id == 0 || nedit::ObjectKindOf(id) != nedit::kLineKind) return false;
-    auto query = Job().Query(
-        "SELECT start_id, end_id, coalesce(layer_id, 0), colour, line_style, thickness, flags "
-        "FROM line WHERE id = ?");
-    query->Bind(1, id);
-    if (!query->Step()) return false;
-    id_ = id;
-    start_ = static_cast<long>(query->Int(0));
-    end_ = static_cast<long>(query->Int(1));
-    layer_ = static_cast<long>(query->Int(2));
-    colour_ = static_cast<int>(query->Int(3));
-    line_style_ = static_cast<int>(query->Int(4));
-    thickness_ = static_cast<int>(query->Int(5));
-    flags_ = static_cast<unsigned>(query->Int(6));
-    return true;
+    return LoadRow(id, {"start_id", "end_id"}, [this](const nedit::Statement& row) {
+        start_ = static_cast<long>(row.Int(0));
+        end_ = static_cast<long>(row.Int(1));
+    });
 }
 
 bool UDBLine::Save(int /*undoFlag*/, bool /*redraw*/, bool /*select*/) {
     if (id_ != 0 && !CanUpdate()) return false;
     return Guarded([&] {
-        nedit::JobDatabase& job = Job();
-        auto write = job.Query(
-            id_ == 0
-                ? "INSERT INTO line (start_id, end_id, layer_id, colour, line_style, thickness, "
-                  "flags) VALUES (?, ?, ?, ?, ?, ?, ?)"
-                : "UPDATE line SET start_id = ?, end_id = ?, layer_id = ?, colour = ?, "
-                  "line_style = ?, thickness = ?, flags = ? WHERE id = ?");
-        write->Bind(1, start_).Bind(2, end_);
-        write->BindOptionalId(3, layer_);
-        write->Bind(4, colour_).Bind(5, line_style_).Bind(6, thickness_);
-        write->Bind(7, static_cast<long long>(flags_));
-        if (id_ != 0) write->Bind(8, id_);
-        write->Run();
-        if (id_ == 0) id_ = static_cast<long>(job.LastInsertId());
+        SaveRow({"start_id", "end_id"},
+                [this](nedit::Statement& write) { write.Bind(1, start_).Bind(2, end_); });
     });
 }
 
@@ -62,42 +110,21 @@ UDBArc::UDBArc(USurveyDoc* job, long id) : UDBLinework(job, nedit::kArcKind, "ar
 }
 
 bool UDBArc::Load(long id) {
-    if (id == 0 || nedit::ObjectKindOf(id) != nedit::kArcKind) return false;
-    auto query = Job().Query(
-        "SELECT start_id, end_id, third_id, arc_type, coalesce(layer_id, 0), colour, line_style, "
-        "thickness, flags FROM arc WHERE id = ?");
-    query->Bind(1, id);
-    if (!query->Step()) return false;
-    id_ = id;
-    start_ = static_cast<long>(query->Int(0));
-    end_ = static_cast<long>(query->Int(1));
-    third_ = static_cast<long>(query->Int(2));
-    arc_type_ = static_cast<int>(query->Int(3));
-    layer_ = static_cast<long>(query->Int(4));
-    colour_ = static_cast<int>(query->Int(5));
-    line_style_ = static_cast<int>(query->Int(6));
-    thickness_ = static_cast<int>(query->Int(7));
-    flags_ = static_cast<unsigned>(query->Int(8));
-    return true;
+    return LoadRow(id, {"start_id", "end_id", "third_id", "arc_type"},
+                   [this](const nedit::Statement& row) {
+                       start_ = static_cast<long>(row.Int(0));
+                       end_ = static_cast<long>(row.Int(1));
+                       third_ = static_cast<long>(row.Int(2));
+                       arc_type_ = static_cast<int>(row.Int(3));
+                   });
 }
 
 bool UDBArc::Save(int /*undoFlag*/, bool /*redraw*/, bool /*select*/) {
     if (id_ != 0 && !CanUpdate()) return false;
     return Guarded([&] {
-        nedit::JobDatabase& job = Job();
-        auto write = job.Query(
-            id_ == 0 ? "INSERT INTO arc (start_id, end_id, third_id, arc_type, layer_id, colour, "
-                       "line_style, thickness, flags) VALUES (?, ?, ?, ?, ?, ?, ?, ?, ?)"
-                     : "UPDATE arc SET start_id = ?, end_id = ?, third_id = ?, arc_type = ?, "
-                       "layer_id = ?, colour = ?, line_style = ?, thickness = ?, flags = ? "
-                       "WHERE id = ?");
-        write->Bind(1, start_).Bind(2, end_).Bind(3, third_).Bind(4, arc_type_);
-        write->BindOptionalId(5, layer_);
-        write->Bind(6, colour_).Bind(7, line_style_).Bind(8, thickness_);
-        write->Bind(9, static_cast<long long>(flags_));
-        if (id_ != 0) write->Bind(10, id_);
-        write->Run();
-        if (id_ == 0) id_ = static_cast<long>(job.LastInsertId());
+        SaveRow({"start_id", "end_id", "third_id", "arc_type"}, [this](nedit::Statement& write) {
+            write.Bind(1, start_).Bind(2, end_).Bind(3, third_).Bind(4, arc_type_);
+        });
     });
 }
 
@@ -115,39 +142,17 @@ UDBCircle::UDBCircle(USurveyDoc* job, long id) : UDBLinework(job, nedit::kCircle
 }
 
 bool UDBCircle::Load(long id) {
-    if (id == 0 || nedit::ObjectKindOf(id) != nedit::kCircleKind) return false;
-    auto query = Job().Query(
-        "SELECT centre_id, radius, coalesce(layer_id, 0), colour, line_style, thickness, flags "
-        "FROM circle WHERE id = ?");
-    query->Bind(1, id);
-    if (!query->Step()) return false;
-    id_ = id;
-    centre_ = static_cast<long>(query->Int(0));
-    radius_ = query->Real(1);
-    layer_ = static_cast<long>(query->Int(2));
-    colour_ = static_cast<int>(query->Int(3));
-    line_style_ = static_cast<int>(query->Int(4));
-    thickness_ = static_cast<int>(query->Int(5));
-    flags_ = static_cast<unsigned>(query->Int(6));
-    return true;
+    return LoadRow(id, {"centre_id", "radius"}, [this](const nedit::Statement& row) {
+        centre_ = static_cast<long>(row.Int(0));
+        radius_ = row.Real(1);
+    });
 }
 
 bool UDBCircle::Save(int /*undoFlag*/, bool /*redraw*/, bool /*select*/) {
     if (id_ != 0 && !CanUpdate()) return false;
     return Guarded([&] {
-        nedit::JobDatabase& job = Job();
-        auto write = job.Query(
-            id_ == 0 ? "INSERT INTO circle (centre_id, radius, layer_id, colour, line_style, "
-                       "thickness, flags) VALUES (?, ?, ?, ?, ?, ?, ?)"
-                     : "UPDATE circle SET centre_id = ?, radius = ?, layer_id = ?, colour = ?, "
-                       "line_style = ?, thickness = ?, flags = ? WHERE id = ?");
-        write->Bind(1, centre_).Bind(2, radius_);
-        write->BindOptionalId(3, layer_);
-        write->Bind(4, colour_).Bind(5, line_style_).Bind(6, thickness_);
-        write->Bind(7, static_cast<long long>(flags_));
-        if (id_ != 0) write->Bind(8, id_);
-        write->Run();
-        if (id_ == 0) id_ = static_cast<long>(job.LastInsertId());
+        SaveRow({"centre_id", "radius"},
+                [this](nedit::Statement& write) { write.Bind(1, centre_).Bind(2, radius_); });
     });
 }
 

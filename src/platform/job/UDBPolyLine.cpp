@@ -28,25 +28,11 @@ long UDBPolyLine::GetIdAt(int index) const {
 }
 
 bool UDBPolyLine::Load(long id) {
-    if (id == 0 || nedit::ObjectKindOf(id) != nedit::kPolylineKind) return false;
-    nedit::JobDatabase& job = Job();
-    {
-        auto query = job.Query(
-            "SELECT name, coalesce(layer_id, 0), colour, line_style, thickness, flags "
-            "FROM polyline WHERE id = ?");
-        query->Bind(1, id);
-        if (!query->Step()) return false;
-        id_ = id;
-        name_ = query->Text(0);
-        layer_ = static_cast<long>(query->Int(1));
-        colour_ = static_cast<int>(query->Int(2));
-        line_style_ = static_cast<int>(query->Int(3));
-        thickness_ = static_cast<int>(query->Int(4));
-        flags_ = static_cast<unsigned>(query->Int(5));
-    }
+    if (!LoadRow(id, {"name"}, [this](const nedit::Statement& row) { name_ = row.Text(0); }))
+        return false;
     vertices_.clear();
-    auto query =
-        job.Query("SELECT point_id, bulge FROM polyline_vertex WHERE polyline_id = ? ORDER BY seq");
+    auto query = Job().Query(
+        "SELECT point_id, bulge FROM polyline_vertex WHERE polyline_id = ? ORDER BY seq");
     query->Bind(1, id);
     while (query->Step()) vertices_.push_back({query->Real(1), static_cast<long>(query->Int(0))});
     return true;
@@ -60,19 +46,9 @@ bool UDBPolyLine::Save(int /*undoFlag*/, bool /*redraw*/, bool /*select*/) {
     if (id_ != 0 && !CanUpdate()) return false;
     const bool saved = Guarded([&] {
         nedit::JobDatabase& job = Job();
-        auto write = job.Query(
-            id_ == 0
-                ? "INSERT INTO polyline (name, layer_id, colour, line_style, thickness, flags) "
-                  "VALUES (?, ?, ?, ?, ?, ?)"
-                : "UPDATE polyline SET name = ?, layer_id = ?, colour = ?, line_style = ?, "
-                  "thickness = ?, flags = ? WHERE id = ?");
-        write->Bind(1, name_).BindOptionalId(2, layer_).Bind(3, colour_).Bind(4, line_style_);
-        write->Bind(5, thickness_).Bind(6, static_cast<long long>(flags_));
-        if (id_ != 0) write->Bind(7, id_);
-        write->Run();
-        if (id_ == 0) {
-            id_ = static_cast<long>(job.LastInsertId());
-        } else {
+        const bool updating = id_ != 0;
+        SaveRow({"name"}, [this](nedit::Statement& write) { write.Bind(1, name_); });
+        if (updating) {
             job.Query("DELETE FROM polyline_vertex WHERE polyline_id = ?")->Bind(1, id_).Run();
         }
         int seq = 0;

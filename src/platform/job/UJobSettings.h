@@ -13,6 +13,23 @@
 
 #include "platform/units/Units.h"
 
+/// Names for the arguments of the length writers of UJobSettings (LengthToString,
+/// UnitLengthToString, DistanceToString), so that a call says what it asks for.
+namespace nedit::length {
+constexpr bool kWithUnit = true;
+constexpr bool kNoUnit = false;
+constexpr bool kPlusSign = true;
+constexpr bool kNoSign = false;
+/// Decimals and inch fraction of the job's own settings.
+constexpr int kJobDecimals = -1;
+constexpr int kJobInchFraction = -1;
+/// A coordinate difference, or a length; the two are written alike.
+constexpr bool kCoordinate = true;
+constexpr bool kLength = false;
+/// The last arguments, taken as the suite's callers pass them and without effect.
+constexpr bool kUnused = false;
+}  // namespace nedit::length
+
 class UJobSettings {
   public:
     /// Coordinate order: East before North in forms and columns, or North first.

@@ -16,6 +16,12 @@ int mb::DefaultAnswer(unsigned flags) {
 UDialogLogic::~UDialogLogic() = default;
 DialogHost::~DialogHost() = default;
 
+int DialogHost::Accept(UDialogLogic& dialog) {
+    if (dialog.OnOK()) return mb::IdOk;
+    dialog.OnCancel();
+    return mb::IdCancel;
+}
+
 int AppMessageBox(DialogHost* host, const std::wstring& text, unsigned flags, unsigned help) {
     if (host == nullptr) return mb::DefaultAnswer(flags);
     return host->ShowMessage(text, flags, help);

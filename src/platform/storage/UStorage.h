@@ -31,6 +31,13 @@ constexpr unsigned ShareExclusive = 0x10;
 constexpr unsigned Create = 0x1000;
 constexpr unsigned Transacted = 0x10000;
 }  // namespace stgm
+
+/// Commit flags, with the values structured storage has always used. The job's commits
+/// accept them and behave alike under each: a commit is one database transaction.
+namespace stgc {
+constexpr unsigned Default = 0x0;
+constexpr unsigned OnlyIfCurrent = 0x2;
+}  // namespace stgc
 }  // namespace nedit
 
 /// One element of a storage, as EnumElements lists it.

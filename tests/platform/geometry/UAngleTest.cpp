@@ -6,15 +6,31 @@
 #include "platform/geometry/UAngle.h"
 #include "platform/geometry/UWPoint.h"
 
-TEST(UAngle, ValidateDataBringsDegreesIntoOneTurn) {
-    EXPECT_DOUBLE_EQ(UAngle::ValidateData(-90.0), 270.0);
-    EXPECT_DOUBLE_EQ(UAngle::ValidateData(360.0), 0.0);
-    EXPECT_DOUBLE_EQ(UAngle::ValidateData(725.0), 5.0);  // two turns and 5
-    EXPECT_DOUBLE_EQ(UAngle::ValidateData(-720.0), 0.0);
-    EXPECT_DOUBLE_EQ(UAngle::ValidateData(359.5), 359.5);
-    EXPECT_DOUBLE_EQ(UAngle::ValidateData(0.0), 0.0);
-    // -1e-15 + 360 rounds to 360.0 itself; the answer must still lie below one turn.
-    EXPECT_DOUBLE_EQ(UAngle::ValidateData(-1e-15), 0.0);
+namespace {
+
+struct TurnCase {
+    double degrees;
+    double expected;
+};
+
+class ValidateData : public ::testing::TestWithParam<TurnCase> {};
+
+}  // namespace
+
+INSTANTIATE_TEST_SUITE_P(Angles, ValidateData,
+                         ::testing::Values(TurnCase{-90.0, 270.0}, TurnCase{360.0, 0.0},
+                                           TurnCase{725.0, 5.0},  // two turns and 5
+                                           TurnCase{-720.0, 0.0}, TurnCase{359.5, 359.5},
+                                           TurnCase{0.0, 0.0},
+                                           // -1e-15 + 360 rounds to 360.0 itself; the answer must
+                                           // still lie below one turn.
+                                           TurnCase{-1e-15, 0.0}));
+
+TEST_P(ValidateData, BringsDegreesIntoOneTurn) {
+    EXPECT_DOUBLE_EQ(UAngle::ValidateData(GetParam().degrees), GetParam().expected);
+}
+
+TEST(UAngle, ValidateDataHasNoTurnForWhatIsNoNumber) {
     EXPECT_TRUE(std::isnan(UAngle::ValidateData(std::numeric_limits<double>::quiet_NaN())));
     EXPECT_TRUE(std::isnan(UAngle::ValidateData(std::numeric_limits<double>::infinity())));
 }

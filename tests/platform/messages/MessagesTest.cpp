@@ -1,7 +1,7 @@
 #include <gtest/gtest.h>
 
+#include "../../support/HeadlessDialogHost.h"
 #include "platform/messages/DialogHost.h"
-#include "platform/messages/HeadlessDialogHost.h"
 #include "platform/messages/Translate.h"
 
 using namespace nedit;
@@ -45,12 +45,36 @@ TEST(DialogHost, HeadlessHostRecordsMessagesAndFollowsItsScript) {
     EXPECT_EQ(host.Messages()[1].flags, mb::OkCancel);
 
     AskName dialog;
-    EXPECT_EQ(host.RunDialog(dialog), mb::IdCancel);  // an empty name is refused by OnOK
-    host.SetDialogScript(L"AskName", [](UDialogLogic& shown) {
-        static_cast<AskName&>(shown).name = L"P1";
+    EXPECT_EQ(host.Run(dialog), mb::IdCancel);  // an empty name is refused by OnOK
+    host.SetFace<AskName>([](AskName& shown) {
+        shown.name = L"P1";
         return shown.OnOK() ? mb::IdOk : mb::IdCancel;
     });
-    EXPECT_EQ(host.RunDialog(dialog), mb::IdOk);
+    EXPECT_EQ(host.Run(dialog), mb::IdOk);
     EXPECT_EQ(dialog.name, L"P1");
     EXPECT_EQ(host.DialogsRun().size(), 2u);
+}
+
+namespace {
+// A dialog of another type under the same name: faces go by type, not by name.
+class AskNameAgain : public AskName {};
+}  // namespace
+
+TEST(DialogHost, AFaceServesItsOwnTypeAndTheDefaultAllOthers) {
+    HeadlessDialogHost host;
+    int faced = 0;
+    host.SetFace<AskName>([&faced](AskName& shown) {
+        ++faced;
+        shown.name = L"faced";
+        return mb::IdOk;
+    });
+    AskName first;
+    AskNameAgain second;
+    second.name = L"given";
+    EXPECT_EQ(host.Run(first), mb::IdOk);
+    EXPECT_EQ(host.Run(second), mb::IdOk);  // accepted by the default face, as it stands
+    EXPECT_EQ(faced, 1);
+    EXPECT_EQ(first.name, L"faced");
+    EXPECT_EQ(second.name, L"given");
+    EXPECT_EQ(host.DialogsRun(), (std::vector<std::wstring>{L"AskName", L"AskName"}));
 }

@@ -6,18 +6,29 @@
 
 using namespace nedit;
 
-TEST(NumberText, TextToDoubleReadsTheLeadingNumberOrGivesZero) {
-    struct Case {
-        const wchar_t* text;
-        double expected;
-    };
-    const Case cases[] = {
-        {L"35.214", 35.214}, {L"  -2.5", -2.5},    {L"+7", 7.0},  {L"12.5M", 12.5},
-        {L"1.5e3", 1500.0},  {L".5", 0.5},         {L"", 0.0},    {L"ABC", 0.0},
-        {L"--3", 0.0},       {L"nan", 0.0},        {L"inf", 0.0}, {L"1e400", 0.0},
-        {L"1,5", 1.0},       {L"0.99960", 0.9996},
-    };
-    for (const Case& c : cases) EXPECT_DOUBLE_EQ(TextToDouble(c.text), c.expected) << c.text;
+namespace {
+
+struct NumberCase {
+    const wchar_t* text;
+    double expected;
+};
+
+class TextToDoubleReads : public ::testing::TestWithParam<NumberCase> {};
+
+}  // namespace
+
+INSTANTIATE_TEST_SUITE_P(Texts, TextToDoubleReads,
+                         ::testing::Values(NumberCase{L"35.214", 35.214},
+                                           NumberCase{L"  -2.5", -2.5}, NumberCase{L"+7", 7.0},
+                                           NumberCase{L"12.5M", 12.5}, NumberCase{L"1.5e3", 1500.0},
+                                           NumberCase{L".5", 0.5}, NumberCase{L"", 0.0},
+                                           NumberCase{L"ABC", 0.0}, NumberCase{L"--3", 0.0},
+                                           NumberCase{L"nan", 0.0}, NumberCase{L"inf", 0.0},
+                                           NumberCase{L"1e400", 0.0}, NumberCase{L"1,5", 1.0},
+                                           NumberCase{L"0.99960", 0.9996}));
+
+TEST_P(TextToDoubleReads, TheLeadingNumberOrGivesZero) {
+    EXPECT_DOUBLE_EQ(TextToDouble(GetParam().text), GetParam().expected);
 }
 
 TEST(NumberText, TextToIntReadsTheLeadingWholeNumber) {

@@ -1,4 +1,4 @@
-#include "../reduction/ReductionFixture.h"
+#include "ReductionFixture.h"
 
 using PointStores = ReductionFixture;
 

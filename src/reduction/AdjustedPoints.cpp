@@ -1,17 +1,19 @@
-// Points that the engine derived and that must outlive the run go back into the record
-// list as ordinary rows: adjusted points below the marker row, addition points above it.
+// Points that the engine derived and that must outlive the run go back into the rows as
+// ordinary records: adjusted points below the marker row, addition points above it. These
+// writers touch only the engine's point stores and the rows, so they live beside the engine;
+// what the traverse computes reaches them through those stores.
 
-#include "document/UListCtrl.h"
 #include "platform/geometry/Tolerance.h"
 #include "platform/text/Format.h"
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
+#include "records/RowSource.h"
 #include "reduction/UNeditDatabase.h"
 
 namespace {
 
 // The lowest marker row: the list is searched from its last row upward.
-int FindMarker(const UListCtrl& list) {
+int FindMarker(const nedit::RowSource& list) {
     for (int row = list.GetItemCount() - 1; row >= 0; --row) {
         if (nedit::ToUpper(nedit::TrimView(list.GetItemText(row))) == kAdjustedPointsMarker)
             return row;
@@ -21,7 +23,7 @@ int FindMarker(const UListCtrl& list) {
 
 }  // namespace
 
-int UNeditDatabase::SaveAdjustedPt2CtrlList(UListCtrl* list) {
+int UNeditDatabase::SaveAdjustedPt2CtrlList(nedit::RowSource* list) {
     if (list == nullptr || list->GetItemCount() == 0 || TravPtList.empty()) return 0;
     const int count = list->GetItemCount();
     int marker = FindMarker(*list);
@@ -45,15 +47,13 @@ int UNeditDatabase::SaveAdjustedPt2CtrlList(UListCtrl* list) {
     return 1;
 }
 
-int UNeditDatabase::SaveAdditionPt2CtrlList(UListCtrl* list) {
+int UNeditDatabase::SaveAdditionPt2CtrlList(nedit::RowSource* list) {
     if (list == nullptr || list->GetItemCount() == 0 || AddPtList.empty()) return 0;
     const int marker = FindMarker(*list);
     int insert_at = marker >= 0 ? marker : list->GetItemCount();
-    UListCtrl* const saved = ListCtrl;
-    ListCtrl = list;  // FindXYZ reads the list being written
     for (const UNeditPt& point : AddPtList) {
         double e = 0.0, n = 0.0, h = 0.0;
-        const int row = FindXYZ(point.GetID(), e, n, h);
+        const int row = FindXYZ(*list, point.GetID(), e, n, h);
         const std::wstring text = FormatXYZRecord(point.GetID(), point.x, point.y, point.z);
         if (row < 0) {
             list->AddRecord(insert_at++, text);
@@ -63,21 +63,18 @@ int UNeditDatabase::SaveAdditionPt2CtrlList(UListCtrl* list) {
             list->AddRecord(row, text);
         }
     }
-    ListCtrl = saved;
     return 1;
 }
 
 void UNeditDatabase::DelAdjPts() {
     if (TravPtList.empty()) return;
-    TravPtList.clear();
-    TravPtIndex.Clear();
-    if (ListCtrl == nullptr || ListCtrl->GetItemCount() == 0) return;
-    const int marker = FindMarker(*ListCtrl);
+    TravPtList.Clear();
+    if (Rows == nullptr || Rows->GetItemCount() == 0) return;
+    const int marker = FindMarker(*Rows);
     if (marker < 0) return;
-    while (ListCtrl->GetItemCount() > marker) ListCtrl->DeleteItem(ListCtrl->GetItemCount() - 1);
+    while (Rows->GetItemCount() > marker) Rows->DeleteItem(Rows->GetItemCount() - 1);
 }
 
 void UNeditDatabase::ClearAddPtList() {
-    AddPtList.clear();
-    AddPtIndex.Clear();
+    AddPtList.Clear();
 }

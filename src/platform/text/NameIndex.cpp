@@ -1,4 +1,4 @@
-#include "reduction/NameIndex.h"
+#include "platform/text/NameIndex.h"
 
 namespace {
 

@@ -1,0 +1,43 @@
+// The gate every row passes on its way into a document's rows.
+
+#include <string>
+
+#include "RecordFixture.h"
+#include "records/RecordText.h"
+
+namespace {
+
+struct GateCase {
+    const wchar_t* text;
+    const wchar_t* row;
+};
+
+class NormaliseRowGate : public RecordFixture, public ::testing::WithParamInterface<GateCase> {};
+using RowGate = RecordFixture;
+
+}  // namespace
+
+INSTANTIATE_TEST_SUITE_P(
+    Rows, NormaliseRowGate,
+    ::testing::Values(
+        // A known key is laid out with its key padded to ten places.
+        GateCase{L"ss id=p1,ha=1.0000", L"SS        ID=P1,HA=1.0000"},
+        GateCase{L"  scale 1.0  ", L"SCALE     1.0"},
+        // The key ends at a comma too.
+        GateCase{L"stn,id=a", L"STN       ,ID=A"},
+        // A comment is only upper-cased; an unknown key becomes one, so nothing is lost.
+        GateCase{L"#  note:  Keep", L"#  NOTE:  KEEP"},
+        GateCase{L"weather sunny", L"# WEATHER SUNNY"},
+        // Nothing stays nothing.
+        GateCase{L"", L""}, GateCase{L"   ", L""}));
+
+TEST_P(NormaliseRowGate, LaysOutKnownRowsAndKeepsTheRest) {
+    EXPECT_EQ(NormaliseRow(format, GetParam().text), GetParam().row);
+}
+
+TEST_F(RowGate, NoRowHoldsMoreThan255Characters) {
+    EXPECT_EQ(NormaliseRow(format, L"x" + std::wstring(300, L'y')).size(), 255u);
+    const std::wstring unknown = NormaliseRow(format, L"unknown" + std::wstring(260, L'z'));
+    EXPECT_EQ(unknown.size(), 255u);
+    EXPECT_EQ(unknown.substr(0, 9), L"# UNKNOWN");
+}
