@@ -33,7 +33,8 @@ std::string ScaledInteger(long long value, int decimals);
 /// 4), decimal degrees or gons.
 std::string AngleText(double degrees, AngleOut unit, int decimals);
 
-/// Bytes that end a transmission: ETX, EOT and SUB (the old end-of-file mark).
+/// Bytes that end a transmission: ETX, EOT and SUB (the old end-of-file mark). The drivers
+/// take them so only at the start of a line, where noise seldom puts them.
 bool IsEndOfTransmission(unsigned char byte);
 /// XON and XOFF, which a port without software flow control passes through as data.
 bool IsFlowControl(unsigned char byte);

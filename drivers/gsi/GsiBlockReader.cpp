@@ -12,7 +12,7 @@ bool GsiBlockReader::Feed(const unsigned char* bytes, std::size_t size) {
     for (std::size_t i = 0; i < size && !ended_; ++i) {
         const unsigned char byte = bytes[i];
         ++bytes_;
-        if (sxn::IsEndOfTransmission(byte)) {
+        if (sxn::IsEndOfTransmission(byte) && token_size_ == 0 && text_.empty()) {
             Finish();
             ended_ = true;
         } else if (byte == '\n' && last_cr_) {

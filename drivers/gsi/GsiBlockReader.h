@@ -10,7 +10,8 @@
 //   the text handed on says that more followed.
 // - Data with no GSI word at all in their first 4096 bytes, or none before they end, are
 //   not GSI: nothing of them is handed on as blocks, and the handler hears it once.
-// - ETX, EOT or SUB ends the transfer; XON and XOFF are dropped.
+// - ETX, EOT or SUB at the start of a line ends the transfer; inside a line it is noise that
+//   spoils its block. XON and XOFF are dropped.
 
 #include <cstddef>
 #include <string>

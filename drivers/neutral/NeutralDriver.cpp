@@ -10,7 +10,8 @@
 //   UTF-8 is read as Latin-1, and control characters in it become blanks.
 // - A line longer than a record may be is not cut into a record with half its fields: it
 //   becomes a comment that names its line, and the user is told how many there were.
-// - ETX, EOT or SUB ends the transfer; XON and XOFF that reach the driver are dropped.
+// - ETX, EOT or SUB at the start of a line ends the transfer; inside a line it is a control
+//   character like any other. XON and XOFF that reach the driver are dropped.
 
 #include <string>
 
@@ -41,7 +42,7 @@ class NeutralSession : public sxn_session {
     int Translate(const unsigned char* bytes, std::size_t size) override {
         for (std::size_t i = 0; i < size && !ended_; ++i) {
             const unsigned char byte = bytes[i];
-            if (sxn::IsEndOfTransmission(byte)) {
+            if (sxn::IsEndOfTransmission(byte) && length_ == 0) {
                 EndLine();
                 ended_ = true;
             } else if (byte == '\n' && last_cr_) {

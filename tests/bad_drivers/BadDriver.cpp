@@ -1,7 +1,9 @@
 // A driver with one fault, chosen when it is built: BAD_MISSING_SYMBOL leaves out a function
 // of the interface, BAD_WRONG_VERSION says it was built for another interface version, and
-// BAD_CRASH_ON_LOAD crashes while the library is being opened. The driver manager must
-// refuse each by name and keep the good drivers beside it.
+// BAD_CRASH_ON_LOAD crashes and BAD_HANG_ON_LOAD hangs while the library is being opened.
+// The driver manager must refuse each by name and keep the good drivers beside it.
+
+#include <unistd.h>
 
 #include <csignal>
 
@@ -12,6 +14,16 @@ namespace {
 struct CrashOnLoad {
     CrashOnLoad() { std::raise(SIGSEGV); }
 } crash;
+}  // namespace
+#endif
+
+#ifdef BAD_HANG_ON_LOAD
+namespace {
+struct HangOnLoad {
+    HangOnLoad() {
+        for (;;) pause();
+    }
+} hang;
 }  // namespace
 #endif
 
