@@ -148,6 +148,33 @@ int UPortSetting::SetCommPort(nedit::SerialPort& handle, int baud, int dataBits,
     return handle.Apply(ToSettings(baud, dataBits, stopBits, parity, ctrl)) ? 1 : 0;
 }
 
+int UPortSetting::SetCommPortTexts(nedit::SerialPort& handle, const std::wstring& baud,
+                                   const std::wstring& dataBits, const std::wstring& stopBits,
+                                   const std::wstring& parity, const std::wstring& flow) {
+    return SetCommPort(handle, nedit::TextToInt(baud), nedit::TextToInt(dataBits),
+                       GetStopBit(stopBits), GetParity(ParityChar(parity)),
+                       GetCtrls(FlowChar(flow)));
+}
+
+void UPortSetting::ToTexts(int baud, int dataBits, int stopBits, int parity, int ctrl,
+                           std::wstring& baudText, std::wstring& dataBitsText,
+                           std::wstring& stopBitsText, std::wstring& parityText,
+                           std::wstring& flowText) {
+    baudText = nedit::Format(L"%d", baud);
+    dataBitsText = nedit::Format(L"%d", dataBits);
+    stopBitsText = StopText(stopBits);
+    parityText = ParityText(parity);
+    flowText = FlowText(ctrl);
+}
+
+void UPortSetting::LoadTexts(const std::wstring& port, std::wstring& baud, std::wstring& dataBits,
+                             std::wstring& stopBits, std::wstring& parity, std::wstring& flow) {
+    const nedit::SerialSettings settings = LoadSettings(port);
+    ToTexts(settings.baud, settings.dataBits, static_cast<int>(settings.stopBits),
+            static_cast<int>(settings.parity), static_cast<int>(settings.flow), baud, dataBits,
+            stopBits, parity, flow);
+}
+
 nedit::SerialSettings UPortSetting::ToSettings(int baud, int dataBits, int stopBits, int parity,
                                                int ctrl) {
     nedit::SerialSettings settings;

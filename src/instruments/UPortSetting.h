@@ -50,6 +50,18 @@ class UPortSetting {
     /// Applies the numeric values to the port by the port rule; 1 when the port took them.
     static int SetCommPort(nedit::SerialPort& handle, int baud, int dataBits, int stopBits,
                            int parity, int ctrl);
+    /// Applies values as the lists show them ("9600", "8", "1.5", "EVEN", "XON/XOFF").
+    static int SetCommPortTexts(nedit::SerialPort& handle, const std::wstring& baud,
+                                const std::wstring& dataBits, const std::wstring& stopBits,
+                                const std::wstring& parity, const std::wstring& flow);
+    /// The numeric values as the lists show them.
+    static void ToTexts(int baud, int dataBits, int stopBits, int parity, int ctrl,
+                        std::wstring& baudText, std::wstring& dataBitsText,
+                        std::wstring& stopBitsText, std::wstring& parityText,
+                        std::wstring& flowText);
+    /// The [Ports] entry of `port` as the lists show it.
+    static void LoadTexts(const std::wstring& port, std::wstring& baud, std::wstring& dataBits,
+                          std::wstring& stopBits, std::wstring& parity, std::wstring& flow);
     /// The values as the port takes them.
     static nedit::SerialSettings ToSettings(int baud, int dataBits, int stopBits, int parity,
                                             int ctrl);
