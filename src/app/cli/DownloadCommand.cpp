@@ -88,20 +88,13 @@ bool ParsePortOption(const std::vector<std::string>& args, std::size_t& i,
 }
 
 bool ParseOptions(const std::vector<std::string>& args, DownloadOptions& options) {
-    for (std::size_t i = 0; i < args.size(); ++i) {
-        const int taken = ParseTransferOption(args, i, options.transfer);
-        if (taken > 0) continue;
-        if (taken == 0 && ParsePortOption(args, i, options)) continue;
-        std::fprintf(stderr,
-                     "sxnedit: download: unexpected or incomplete '%s' (see sxnedit --help)\n",
-                     args[i].c_str());
-        return false;
-    }
-    if (options.port.empty()) {
-        std::fprintf(stderr, "sxnedit: download needs --port COM1|DEVICE (see sxnedit --help)\n");
-        return false;
-    }
-    return CheckTransferOptions(options.transfer, "download");
+    const auto port = [&options](const std::vector<std::string>& words, std::size_t& i) {
+        return ParsePortOption(words, i, options);
+    };
+    if (!ParseTransferArguments(args, "download", options.transfer, port)) return false;
+    if (!options.port.empty()) return true;
+    std::fprintf(stderr, "sxnedit: download needs --port COM1|DEVICE (see sxnedit --help)\n");
+    return false;
 }
 
 // The port's stored settings with the options laid over them.

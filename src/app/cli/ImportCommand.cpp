@@ -18,23 +18,15 @@ struct ImportOptions {
 };
 
 bool ParseOptions(const std::vector<std::string>& args, ImportOptions& options) {
-    for (std::size_t i = 0; i < args.size(); ++i) {
-        const int taken = ParseTransferOption(args, i, options.transfer);
-        if (taken > 0) continue;
-        if (taken == 0 && !args[i].empty() && args[i][0] != '-' && options.file.empty()) {
-            options.file = args[i];
-            continue;
-        }
-        std::fprintf(stderr,
-                     "sxnedit: import: unexpected or incomplete '%s' (see sxnedit --help)\n",
-                     args[i].c_str());
-        return false;
-    }
-    if (options.file.empty()) {
-        std::fprintf(stderr, "sxnedit: import needs a raw file (see sxnedit --help)\n");
-        return false;
-    }
-    return CheckTransferOptions(options.transfer, "import");
+    const auto file = [&options](const std::vector<std::string>& words, std::size_t& i) {
+        if (words[i].empty() || words[i][0] == '-' || !options.file.empty()) return false;
+        options.file = words[i];
+        return true;
+    };
+    if (!ParseTransferArguments(args, "import", options.transfer, file)) return false;
+    if (!options.file.empty()) return true;
+    std::fprintf(stderr, "sxnedit: import needs a raw file (see sxnedit --help)\n");
+    return false;
 }
 
 int ImportRawFile(const ImportOptions& options) {

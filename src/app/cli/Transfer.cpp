@@ -39,8 +39,8 @@ void Error(const std::string& text) {
     std::fprintf(stderr, "sxnedit: %s\n", text.c_str());
 }
 
-}  // namespace
-
+// Takes the option at args[i] (and its value) when it is one of TransferOptions: 1 when
+// taken, 0 when it is none of them, -1 when its value is missing or wrong.
 int ParseTransferOption(const std::vector<std::string>& args, std::size_t& i,
                         TransferOptions& options) {
     const std::string& option = args[i];
@@ -64,7 +64,18 @@ int ParseTransferOption(const std::vector<std::string>& args, std::size_t& i,
     return *choice >= 0 ? 1 : -1;
 }
 
-bool CheckTransferOptions(const TransferOptions& options, const char* command) {
+}  // namespace
+
+bool ParseTransferArguments(const std::vector<std::string>& args, const char* command,
+                            TransferOptions& options, const OwnArgument& own) {
+    for (std::size_t i = 0; i < args.size(); ++i) {
+        const std::size_t at = i;
+        const int taken = ParseTransferOption(args, i, options);
+        if (taken > 0 || (taken == 0 && own(args, i))) continue;
+        std::fprintf(stderr, "sxnedit: %s: unexpected or incomplete '%s' (see sxnedit --help)\n",
+                     command, args[at].c_str());
+        return false;
+    }
     const char* problem =
         options.instrument.empty()                        ? "needs --instrument NAME"
         : !options.output.empty() && !options.job.empty() ? "takes -o or --job, not both"

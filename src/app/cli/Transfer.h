@@ -4,6 +4,7 @@
 // afterwards, and the progress line with Ctrl-C as abort.
 
 #include <csignal>
+#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
@@ -27,14 +28,15 @@ struct TransferOptions {
     int lengths = -1;    // --lengths: 0 m, 1 ft, 2 usft; -1 the job's
 };
 
-/// Takes the option at args[i] (and its value) when it is one of TransferOptions. Gives 1
-/// when taken (i then stands on its value), 0 when the option is not one of these, -1 when
-/// its value is missing or wrong.
-int ParseTransferOption(const std::vector<std::string>& args, std::size_t& i,
-                        TransferOptions& options);
-/// The checks every transfer's options pass: an instrument, -o or --job but not both,
-/// --name only with --job. False, with the reason on standard error.
-bool CheckTransferOptions(const TransferOptions& options, const char* command);
+/// Takes a command's own argument at args[i], moving i past a value it takes; false when the
+/// argument is not the command's or its value is wrong.
+using OwnArgument = std::function<bool(const std::vector<std::string>& args, std::size_t& i)>;
+
+/// Reads the arguments of `command`: the options of TransferOptions, and the command's own
+/// through `own`. Then checks them: an instrument, -o or --job but not both, --name only with
+/// --job. False, with the reason on standard error.
+bool ParseTransferArguments(const std::vector<std::string>& args, const char* command,
+                            TransferOptions& options, const OwnArgument& own);
 
 /// The document that receives the records, with its list and the console host.
 class TransferTarget {

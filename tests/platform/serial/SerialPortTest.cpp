@@ -2,43 +2,13 @@
 // back, and failures say what went wrong.
 
 #include <gtest/gtest.h>
-#include <pty.h>
-#include <unistd.h>
 
+#include <chrono>
+
+#include "../../document/FakeInstrument.h"
 #include "platform/serial/SerialPort.h"
 
 namespace {
-
-// A pseudo-terminal; the port opens its far end.
-class PseudoTerminal {
-  public:
-    PseudoTerminal() {
-        int slave = -1;
-        char name[256] = {};
-        if (openpty(&master_, &slave, name, nullptr, nullptr) == 0) {
-            path_ = name;
-            close(slave);
-        }
-    }
-    ~PseudoTerminal() { Close(); }
-    const std::string& Path() const { return path_; }
-    void Send(const std::string& bytes) {
-        ASSERT_EQ(write(master_, bytes.data(), bytes.size()), static_cast<ssize_t>(bytes.size()));
-    }
-    std::string Receive() {
-        char buffer[64];
-        const ssize_t n = read(master_, buffer, sizeof buffer);
-        return n > 0 ? std::string(buffer, static_cast<std::size_t>(n)) : std::string();
-    }
-    void Close() {
-        if (master_ >= 0) close(master_);
-        master_ = -1;
-    }
-
-  private:
-    int master_ = -1;
-    std::string path_;
-};
 
 using nedit::FlowControl;
 using nedit::Parity;
@@ -50,9 +20,9 @@ class SerialValues : public ::testing::TestWithParam<SerialSettings> {};
 // A pseudo-terminal keeps the rate, the stop bits and the flow control; it always runs eight
 // data bits without parity, whatever it is told, so those two are a real port's to show.
 TEST_P(SerialValues, ReachThePortAndReadBack) {
-    PseudoTerminal terminal;
+    FakeInstrument terminal;
     nedit::SerialPort port;
-    ASSERT_TRUE(port.Open(terminal.Path())) << port.LastError();
+    ASSERT_TRUE(port.Open(terminal.Port())) << port.LastError();
     ASSERT_TRUE(port.Apply(GetParam())) << port.LastError();
     SerialSettings current;
     ASSERT_TRUE(port.Current(current));
@@ -80,9 +50,9 @@ INSTANTIATE_TEST_SUITE_P(
                       Values(921600, 8, StopBits::One, Parity::Space, FlowControl::XonXoff)));
 
 TEST(SerialPort, OneAndAHalfStopBitsAreTheLongStop) {
-    PseudoTerminal terminal;
+    FakeInstrument terminal;
     nedit::SerialPort port;
-    ASSERT_TRUE(port.Open(terminal.Path()));
+    ASSERT_TRUE(port.Open(terminal.Port()));
     ASSERT_TRUE(port.Apply(Values(4800, 5, StopBits::OneAndHalf, Parity::None, FlowControl::None)));
     SerialSettings current;
     ASSERT_TRUE(port.Current(current));
@@ -90,21 +60,21 @@ TEST(SerialPort, OneAndAHalfStopBitsAreTheLongStop) {
 }
 
 TEST(SerialPort, ValuesThePortCannotTakeAreRefusedWithAReason) {
-    PseudoTerminal terminal;
+    FakeInstrument terminal;
     nedit::SerialPort port;
-    ASSERT_TRUE(port.Open(terminal.Path()));
+    ASSERT_TRUE(port.Open(terminal.Port()));
     EXPECT_FALSE(port.Apply(Values(14400, 8, StopBits::One, Parity::None, FlowControl::None)));
     EXPECT_EQ(port.LastError(),
-              "The serial port " + terminal.Path() + " cannot run at 14400 baud.");
+              "The serial port " + terminal.Port() + " cannot run at 14400 baud.");
     EXPECT_FALSE(port.Apply(Values(9600, 4, StopBits::One, Parity::None, FlowControl::None)));
     EXPECT_EQ(port.LastError(),
-              "The serial port " + terminal.Path() + " cannot send words of 4 data bits.");
+              "The serial port " + terminal.Port() + " cannot send words of 4 data bits.");
 }
 
 TEST(SerialPort, ReadsWithATimeOutWritesAndSeesTheLinkClose) {
-    PseudoTerminal terminal;
+    FakeInstrument terminal;
     nedit::SerialPort port;
-    ASSERT_TRUE(port.Open(terminal.Path()));
+    ASSERT_TRUE(port.Open(terminal.Port()));
     ASSERT_TRUE(port.Apply(SerialSettings{}));
     unsigned char bytes[16];
     EXPECT_EQ(port.Read(bytes, sizeof bytes, 20), 0);
@@ -113,23 +83,23 @@ TEST(SerialPort, ReadsWithATimeOutWritesAndSeesTheLinkClose) {
     EXPECT_EQ(std::string(reinterpret_cast<char*>(bytes), 3), "AB\r");  // no CR translation
     const unsigned char answer[] = {0x06};
     EXPECT_EQ(port.Write(answer, 1), 1);
-    EXPECT_EQ(terminal.Receive(), "\x06");
+    EXPECT_EQ(terminal.Receive(std::chrono::milliseconds(100)), "\x06");
     terminal.Close();
     EXPECT_EQ(port.Read(bytes, sizeof bytes, 1000), -1);
-    EXPECT_EQ(port.LastError(), "The link on " + terminal.Path() + " has closed.");
+    EXPECT_EQ(port.LastError(), "The link on " + terminal.Port() + " has closed.");
 }
 
 TEST(SerialPort, OnlyOneProgramHoldsAPortAndOthersAreToldWhy) {
-    PseudoTerminal terminal;
+    FakeInstrument terminal;
     nedit::SerialPort first;
     nedit::SerialPort second;
-    ASSERT_TRUE(first.Open(terminal.Path()));
-    EXPECT_FALSE(second.Open(terminal.Path()));
+    ASSERT_TRUE(first.Open(terminal.Port()));
+    EXPECT_FALSE(second.Open(terminal.Port()));
     EXPECT_EQ(second.LastError(),
-              "The serial port " + terminal.Path() + " is in use by another program.");
+              "The serial port " + terminal.Port() + " is in use by another program.");
     first.Close();
     first.Close();
-    EXPECT_TRUE(second.Open(terminal.Path()));
+    EXPECT_TRUE(second.Open(terminal.Port()));
     EXPECT_FALSE(first.Open("/nonexistent/ttyS0"));
     EXPECT_EQ(first.LastError(), "There is no serial port /nonexistent/ttyS0.");
     EXPECT_FALSE(first.Open("/dev/null"));
