@@ -10,12 +10,14 @@
 // - Reading a stream stops at its first empty line, as it always has; when text follows that
 //   line the user is told how many lines were not read, so nothing goes unnoticed.
 
+#include <chrono>
 #include <memory>
 #include <string>
 #include <vector>
 
 #include "document/InputStack.h"
 #include "document/UNeditSettings.h"
+#include "instruments/UDeviceManager.h"
 #include "platform/job/UDocument.h"
 #include "platform/job/UJobSettings.h"
 #include "platform/messages/ProgressSink.h"
@@ -25,6 +27,7 @@
 #include "report/OutParamStruct.h"
 #include "report/ReportContext.h"
 
+class NamelessCoordinates;
 class UListCtrl;
 class UNeditDatabase;
 class UNeditReport;
@@ -114,8 +117,11 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     /// The host of the document's messages, and of its list's.
     void SetDialogHost(nedit::DialogHost* host);
     nedit::DialogHost* GetDialogHost() const { return Host; }
-    nedit::ProgressSink& GetProgress() { return Progress; }
-    bool GetAbortProcess() const { return Progress.AbortRequested(); }
+    nedit::ProgressSink& GetProgress() { return *Progress; }
+    /// Progress and the abort flag go to `sink` from now on (the window's progress bar, the
+    /// terminal); null gives the document its own silent sink back.
+    void SetProgressSink(nedit::ProgressSink* sink) { Progress = sink ? sink : &OwnProgress; }
+    bool GetAbortProcess() const { return Progress->AbortRequested(); }
     void SetAbortProcess(bool abort);
     bool GetAbortProcessOn() const { return AbortProcessOn; }
     void SetAbortProcessOn(bool on) { AbortProcessOn = on; }
@@ -135,7 +141,39 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     /// `extra` carries a value in or out, as the command's kind says.
     int OnCmdMsg(unsigned id, int code, void* extra);
 
+    // ---- Instruments (UNeditDocImport.cpp, UNeditDocDownload.cpp) ---------------------------
+    /// The driver manager, made on first use with the profile's "Survey Code Control" entry.
+    UDeviceManager* GetDeviceManager();
+    /// Puts another driver manager in place (one that takes its drivers elsewhere).
+    void SetDeviceManager(std::unique_ptr<UDeviceManager> manager);
+    /// The import mode handed to the drivers: the job's angular unit in bits 0 to 2 (1 ddd.mmss,
+    /// 2 degrees, 4 gons), its linear unit in bits 3 to 5 (8 metres, 16 feet, 32 US feet), or
+    /// the mode set by SetImportMode.
+    unsigned GetImportMode() const;
+    /// 0 goes back to the job's units.
+    void SetImportMode(unsigned mode) { ImportMode = mode; }
+    /// Translates the raw file `path` through the loaded driver into `list`, from row 0 on,
+    /// each record treated as a stored row is; the user's abort stops it with the rows read so
+    /// far. What the driver says about the data is shown. 0 when the driver does not start.
+    int Import(const std::wstring& path, UListCtrl* list);
+    /// Receives from the instrument on the open port through the loaded driver into `list`,
+    /// writing the raw bytes to `rawPath`, until the data end, the link closes, no record
+    /// has come for the time-out period and the driver counts the link dead, or the user
+    /// aborts. What arrived stays in the list and the document is marked modified in every
+    /// case. 0 only when the driver does not start.
+    int Download(const std::wstring& rawPath, UListCtrl* list);
+    /// Stops a running transfer and closes the port.
+    void AbortDownProcess();
+    /// The time without a record after which the driver is asked whether the link is dead.
+    static constexpr std::chrono::milliseconds kDownloadTimeOut{10000};
+    void SetDownloadTimeOut(std::chrono::milliseconds period) { DownloadTimeOut = period; }
+
   private:
+    /// A record of a driver enters the list at `row` as a stored row does.
+    void AddTransferRecord(NamelessCoordinates& coordinates, const std::wstring& record,
+                           UListCtrl* list, int row);
+    /// What the driver and the link said during a transfer, shown one message each.
+    void ShowTransferMessages();
     void TakeJobUnits();
     int WriteSettingsStream();
     void StartEngine(UListCtrl* list);
@@ -147,7 +185,8 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     USurveyDoc* SurveyDoc;
     UDocument* ParentDoc;
     nedit::DialogHost* Host = nullptr;
-    nedit::ProgressSink Progress;
+    nedit::ProgressSink OwnProgress;
+    nedit::ProgressSink* Progress = &OwnProgress;
     std::wstring NeuText;
     std::wstring NeuFileName;
     std::unique_ptr<UListCtrl> List;
@@ -159,6 +198,9 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     nedit::NeditIniGuard IniGuard;
     bool AbortProcessOn = false;
     bool CreateReport = true;
+    std::unique_ptr<UDeviceManager> DeviceManager;
+    unsigned ImportMode = 0;
+    std::chrono::milliseconds DownloadTimeOut = kDownloadTimeOut;
 
     std::vector<XInput*> InputStack;
     std::unique_ptr<XInputOption> Option;

@@ -5,31 +5,7 @@ set -u
 sxnedit="$1"
 here="$2"
 data="$here/../data"
-work="$(mktemp -d)"
-trap 'rm -rf "$work"' EXIT
-# Settings files (NEDIT.INI) go to a configuration directory of the test's own.
-export SXNEDIT_CONFIG="$work/config"
-passed=0
-failed=0
-
-# check NAME EXPECTED_STATUS EXPECTED_STDOUT_FILE EXPECTED_STDERR_TEXT -- COMMAND...
-check() {
-    local name="$1" want_status="$2" want_out="$3" want_err="$4"
-    shift 5
-    "$@" >"$work/out" 2>"$work/err"
-    local status=$?
-    local ok=1
-    if [ "$status" -ne "$want_status" ]; then
-        echo "FAIL $name: exit status $status, expected $want_status"; ok=0
-    fi
-    if [ -n "$want_out" ] && ! diff -u "$want_out" "$work/out" >"$work/diff"; then
-        echo "FAIL $name: standard output differs"; cat "$work/diff"; ok=0
-    fi
-    if [ -n "$want_err" ] && [ "$(cat "$work/err")" != "$want_err" ]; then
-        echo "FAIL $name: standard error was '$(cat "$work/err")', expected '$want_err'"; ok=0
-    fi
-    if [ "$ok" -eq 1 ]; then passed=$((passed + 1)); else failed=$((failed + 1)); fi
-}
+. "$here/cli_check.sh"
 
 check rows-lowercase 0 "$here/expected/lowercase.rows" "" -- "$sxnedit" rows "$data/lowercase.neu"
 check rows-missing 2 /dev/null "sxnedit: Failed to open $work/none.neu." -- "$sxnedit" rows "$work/none.neu"
@@ -42,8 +18,6 @@ check unknown-command 64 /dev/null "sxnedit: unknown command 'frobnicate' (see s
 # Jobs: a new job, an import with awkward names and a repeated name, listings, the export,
 # and a second import of the export that must give back the same points.
 job="$work/survey.job"
-# expected FILE: the expected text with @WORK@ standing for the temporary folder.
-expected() { sed "s|@WORK@|$work|g" "$here/expected/$1" >"$work/expected-$1" && echo "$work/expected-$1"; }
 check job-new 0 "$(expected job-new.txt)" "" -- "$sxnedit" job new "$job"
 printf 'name,east,north,height,code\r\nP1,100.5,200.25,10,FNC01\r\n"Zürich, ""A""",1,2,,TREE\r\nP1,101,201,,KB\r\nCTRL,0.1,0.2,-3.5,\r\n' >"$work/points.csv"
 check job-import 0 "$(expected job-import.txt)" \
@@ -137,5 +111,4 @@ check doc-usage 64 /dev/null "" -- "$sxnedit" doc export "$work/docs.job"
 check reduce-missing 2 /dev/null "sxnedit: Failed to open $work/none.neu." -- "$sxnedit" reduce "$work/none.neu"
 check reduce-no-file 64 /dev/null "" -- "$sxnedit" reduce --json
 
-echo "cli: $passed passed, $failed failed"
-[ "$failed" -eq 0 ]
+finish cli

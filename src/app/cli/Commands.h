@@ -16,3 +16,6 @@ int RunRows(const std::vector<std::string>& args);
 int RunReduce(const std::vector<std::string>& args);
 int RunDoc(const std::vector<std::string>& args);
 int RunJob(const std::vector<std::string>& args);
+int RunInstruments(const std::vector<std::string>& args);
+int RunImport(const std::vector<std::string>& args);
+int RunDownload(const std::vector<std::string>& args);

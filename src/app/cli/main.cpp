@@ -51,6 +51,24 @@ const char* const kUsage =
     "                  --report writes the reduction report to a file, or prints it\n"
     "                  for -; --angles, --lengths and --columns set its output units\n"
     "                  and the columns of its side-shot tables for this run\n"
+    "  instruments [--json]\n"
+    "                  the instrument drivers found, with their descriptions and raw\n"
+    "                  file extensions; drivers that were refused, and why\n"
+    "  import RAWFILE --instrument NAME [-o OUT.neu | --job JOB [--name DOC]]\n"
+    "         [--angles dms|deg|gon] [--lengths m|ft|usft]\n"
+    "                  translate an instrument's raw file into neutral records, on\n"
+    "                  standard output, into OUT.neu or into a new document of JOB;\n"
+    "                  the units are the job's unless given\n"
+    "  download --instrument NAME --port COM1..COM8|DEVICE [--baud N]\n"
+    "         [--parity none|odd|even|mark|space] [--data-bits 5..8]\n"
+    "         [--stop-bits 1|1.5|2] [--flow none|xon/xoff|hardware] [--raw OUT]\n"
+    "         [--timeout SECONDS] [-o OUT.neu | --job JOB [--name DOC]]\n"
+    "         [--angles dms|deg|gon] [--lengths m|ft|usft]\n"
+    "                  receive records from an instrument on a serial port until its\n"
+    "                  data end, the link closes, nothing comes for the time-out\n"
+    "                  (10 s) or Ctrl-C; what arrived is kept, the raw data in OUT\n"
+    "                  when --raw is given. Port values not given come from the\n"
+    "                  port's stored settings\n"
     "\n"
     "Options:\n"
     "  -h, --help      show this help and exit\n"
@@ -59,7 +77,9 @@ const char* const kUsage =
     "Exit status: 0 done, 1 failed (for reduce: the run did not reach its end),\n"
     "2 an input file could not be read, "
     "64 the command line is wrong.\n"
-    "Environment: SXNEDIT_DATA_DIR names the directory of the record definition.\n";
+    "Environment: SXNEDIT_DATA_DIR names the directory of the record definition,\n"
+    "SXNEDIT_DRIVER_DIR the directory of the instrument drivers (else drivers/ beside\n"
+    "the program).\n";
 
 int Dispatch(const std::vector<std::string>& words) {
     if (words.empty()) {
@@ -80,6 +100,9 @@ int Dispatch(const std::vector<std::string>& words) {
     if (command == "job") return RunJob(args);
     if (command == "reduce") return RunReduce(args);
     if (command == "doc") return RunDoc(args);
+    if (command == "instruments") return RunInstruments(args);
+    if (command == "import") return RunImport(args);
+    if (command == "download") return RunDownload(args);
     std::fprintf(stderr, "sxnedit: unknown command '%s' (see sxnedit --help)\n", command.c_str());
     return exit_status::Usage;
 }

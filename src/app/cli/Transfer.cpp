@@ -1,0 +1,200 @@
+#include "Transfer.h"
+
+#include <unistd.h>
+
+#include <chrono>
+#include <cstdio>
+#include <initializer_list>
+
+#include "Commands.h"
+#include "document/UListCtrl.h"
+#include "document/URawDataContainer.h"
+#include "instruments/UDeviceManager.h"
+#include "platform/job/JobError.h"
+#include "platform/job/USurveyDoc.h"
+#include "platform/settings/DataDirectory.h"
+#include "platform/text/WideText.h"
+#include "report/NeditIni.h"
+#include "sxnedit_driver.h"
+
+namespace {
+
+volatile std::sig_atomic_t g_interrupted = 0;
+
+void OnInterrupt(int) {
+    g_interrupted = 1;
+}
+
+// The place of `word` among `choices`, or -1.
+int IndexOf(const std::string& word, std::initializer_list<const char*> choices) {
+    int index = 0;
+    for (const char* choice : choices) {
+        if (word == choice) return index;
+        ++index;
+    }
+    return -1;
+}
+
+void Error(const std::string& text) {
+    std::fprintf(stderr, "sxnedit: %s\n", text.c_str());
+}
+
+// Takes the option at args[i] (and its value) when it is one of TransferOptions: 1 when
+// taken, 0 when it is none of them, -1 when its value is missing or wrong.
+int ParseTransferOption(const std::vector<std::string>& args, std::size_t& i,
+                        TransferOptions& options) {
+    const std::string& option = args[i];
+    std::string* text = option == "--instrument" ? &options.instrument
+                        : option == "-o"         ? &options.output
+                        : option == "--job"      ? &options.job
+                        : option == "--name"     ? &options.name
+                                                 : nullptr;
+    int* choice = option == "--angles"    ? &options.angles
+                  : option == "--lengths" ? &options.lengths
+                                          : nullptr;
+    if (text == nullptr && choice == nullptr) return 0;
+    if (i + 1 >= args.size()) return -1;
+    const std::string& value = args[++i];
+    if (text != nullptr) {
+        *text = value;
+        return 1;
+    }
+    *choice = choice == &options.angles ? IndexOf(value, {"dms", "deg", "gon"})
+                                        : IndexOf(value, {"m", "ft", "usft"});
+    return *choice >= 0 ? 1 : -1;
+}
+
+}  // namespace
+
+bool ParseTransferArguments(const std::vector<std::string>& args, const char* command,
+                            TransferOptions& options, const OwnArgument& own) {
+    for (std::size_t i = 0; i < args.size(); ++i) {
+        const std::size_t at = i;
+        const int taken = ParseTransferOption(args, i, options);
+        if (taken > 0 || (taken == 0 && own(args, i))) continue;
+        std::fprintf(stderr, "sxnedit: %s: unexpected or incomplete '%s' (see sxnedit --help)\n",
+                     command, args[at].c_str());
+        return false;
+    }
+    const char* problem =
+        options.instrument.empty()                        ? "needs --instrument NAME"
+        : !options.output.empty() && !options.job.empty() ? "takes -o or --job, not both"
+        : !options.name.empty() && options.job.empty()    ? "takes --name only with --job"
+                                                          : nullptr;
+    if (problem == nullptr) return true;
+    std::fprintf(stderr, "sxnedit: %s %s (see sxnedit --help)\n", command, problem);
+    return false;
+}
+
+TransferTarget::TransferTarget() = default;
+
+TransferTarget::~TransferTarget() {
+    // The document goes before the container and the job it lives in.
+    Document.reset();
+}
+
+UListCtrl& TransferTarget::List() {
+    return Document->OpenList();
+}
+
+UDeviceManager& TransferTarget::Manager() {
+    return *Document->GetDeviceManager();
+}
+
+int TransferTarget::Open(const TransferOptions& options) {
+    if (!options.job.empty()) {
+        try {
+            Job = USurveyDoc::OpenJob(options.job);
+        } catch (const nedit::JobError& error) {
+            Error(error.what());
+            return exit_status::Unreadable;
+        }
+        Container = std::make_unique<URawDataContainer>(Job.get());
+        if (!Container->Open()) {
+            Error("the raw-data documents of " + options.job + " cannot be opened");
+            return exit_status::Failed;
+        }
+        Name = options.name.empty() ? Container->GetUntitledName() : nedit::FromUtf8(options.name);
+        if (Container->GetNeditDoc(Name) != nullptr) {
+            Error("the job has a document " + nedit::ToUtf8(Name) + " already");
+            return exit_status::Failed;
+        }
+    }
+    nedit::InstallDefaultNeditIni(nedit::DataDirectory());
+    Document = std::make_unique<UNeditDoc>(Job.get());
+    Document->SetDialogHost(&ConsoleHost);
+    if (!Document->IsKeysInitialised()) {
+        Error("the record definition could not be loaded: " +
+              nedit::ToUtf8(Document->LastDefinitionError()));
+        return exit_status::Failed;
+    }
+    unsigned mode = Document->GetImportMode();
+    if (options.angles >= 0) mode = (mode & ~7u) | (1u << options.angles);
+    if (options.lengths >= 0) mode = (mode & ~56u) | (SXN_MODE_METRES << options.lengths);
+    Document->SetImportMode(mode);
+    if (!Manager().LoadDLL(nedit::FromUtf8(options.instrument))) {
+        std::vector<std::wstring> names;
+        Manager().GetNameList(names);
+        std::wstring known;
+        for (const std::wstring& name : names) known += (known.empty() ? L"" : L", ") + name;
+        Error(nedit::ToUtf8(Manager().GetLastError()) + " The drivers are: " +
+              (known.empty() ? "none, in " + Manager().Catalogue().Directory()
+                             : nedit::ToUtf8(known)) +
+              ".");
+        return exit_status::Failed;
+    }
+    return exit_status::Ok;
+}
+
+int TransferTarget::Deliver(const TransferOptions& options, const std::string& verb,
+                            const std::string& source) {
+    UListCtrl& list = List();
+    if (!options.output.empty()) {
+        if (Document->Save(nedit::FromUtf8(options.output), &list)) return exit_status::Ok;
+        Error("cannot write " + options.output);
+        return exit_status::Failed;
+    }
+    if (Container) {
+        if (!Document->CreateDocument(Name, Container.get()) || !Document->SaveDocument()) {
+            Error("the document " + nedit::ToUtf8(Name) + " could not be stored in " + options.job);
+            return exit_status::Failed;
+        }
+        std::printf("%s %s as %s (%d records).\n", verb.c_str(), source.c_str(),
+                    nedit::ToUtf8(Name).c_str(), list.GetItemCount());
+        return exit_status::Ok;
+    }
+    for (const std::wstring& row : list.GetRows()) std::printf("%s\n", nedit::ToUtf8(row).c_str());
+    return std::fflush(stdout) == 0 ? exit_status::Ok : exit_status::Failed;
+}
+
+TerminalProgress::TerminalProgress(const UListCtrl& list, const UDeviceManager& manager)
+    : List(list), Manager(manager), Terminal(isatty(STDERR_FILENO) != 0) {
+    g_interrupted = 0;
+    struct sigaction action {};
+    action.sa_handler = &OnInterrupt;
+    sigemptyset(&action.sa_mask);
+    sigaction(SIGINT, &action, &Previous);
+}
+
+TerminalProgress::~TerminalProgress() {
+    sigaction(SIGINT, &Previous, nullptr);
+    if (Shown) std::fputc('\n', stderr);
+}
+
+bool TerminalProgress::Interrupted() const {
+    return g_interrupted != 0;
+}
+
+void TerminalProgress::Update(int, const std::wstring& text) {
+    if (Interrupted()) RequestAbort();
+    if (!Terminal || text.empty()) return;
+    const long long now = std::chrono::duration_cast<std::chrono::milliseconds>(
+                              std::chrono::steady_clock::now().time_since_epoch())
+                              .count();
+    if (Shown && now - LastShown < 200) return;
+    LastShown = now;
+    Shown = true;
+    std::fprintf(stderr, "\r%s: %d records, %lld bytes (Ctrl-C stops)  ",
+                 nedit::ToUtf8(text).c_str(), List.GetItemCount(), Manager.GetBytesReceived());
+    std::fflush(stderr);
+}
