@@ -81,6 +81,17 @@ check version 0 "$work/version" "" -- "$sxnedit" --version
 "$sxnedit" --help >"$work/help"
 grep -q '^Usage: sxnedit COMMAND' "$work/help" && grep -q 'rows FILE.neu' "$work/help" &&
     passed=$((passed + 1)) || { echo "FAIL help: usage text incomplete"; failed=$((failed + 1)); }
+# Every command has a help of its own, and a wrong command line is told with the usage of
+# the command it was meant for.
+"$sxnedit" doc import --help >"$work/help"
+grep -q '^Usage: sxnedit doc import JOB FILE.neu \[OPTIONS\]$' "$work/help" && grep -q -- '--name NAME' "$work/help" &&
+    passed=$((passed + 1)) || { echo "FAIL command-help: doc import --help incomplete"; failed=$((failed + 1)); }
+check command-usage 64 /dev/null "sxnedit: reduce: --angles: rad not in {dms,deg,gon}
+Usage: sxnedit reduce FILE.neu [OPTIONS]
+Run 'sxnedit reduce --help' for more information." -- "$sxnedit" reduce "$work/none.neu" --angles rad
+check group-usage 64 /dev/null "sxnedit: job: a command is needed
+Usage: sxnedit job COMMAND [ARGUMENTS]
+Run 'sxnedit job --help' for more information." -- "$sxnedit" job
 
 # A closed traverse observed exactly from known coordinates: every reduced point lies within
 # 0.001 of the coordinates it was generated from.

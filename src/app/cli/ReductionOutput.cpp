@@ -1,8 +1,9 @@
 #include "ReductionOutput.h"
 
+#include <CLI/CLI.hpp>
 #include <cstdio>
 
-#include "Json.h"
+#include "JsonLayout.h"
 #include "platform/text/WideText.h"
 #include "reduction/UNeditDatabase.h"
 #include "report/UNeditReport.h"
@@ -18,49 +19,41 @@ std::vector<PointRow> ReducedPoints(const UNeditDatabase& engine) {
 }
 
 void PrintJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages) {
-    std::string out =
-        "{\n  \"points\": " + PointsJson(ReducedPoints(engine), 2) + ",\n  \"lines\": [";
-    const char* separator = "\n    ";
+    std::vector<json::Value> lines;
     for (const UNeditLine& line : engine.GetLineList()) {
-        out += separator;
-        out += "{\"from\": " + json::Quote(line.GetFromPt()) +
-               ", \"to\": " + json::Quote(line.GetToPt()) +
-               ", \"station_line\": " + (line.GetStationLine() ? "true" : "false") + "}";
-        separator = ",\n    ";
+        lines.push_back({{"from", json::Text(line.GetFromPt())},
+                         {"to", json::Text(line.GetToPt())},
+                         {"station_line", line.GetStationLine() != 0}});
     }
-    out += "\n  ],\n  \"arcs\": [";
-    separator = "\n    ";
+    std::vector<json::Value> arcs;
     for (const UNeditArc& arc : engine.GetArcList()) {
-        out += separator;
-        out += "{\"start\": " + json::Quote(arc.GetStartPt()) +
-               ", \"end\": " + json::Quote(arc.GetEndPt()) +
-               ", \"third\": " + json::Quote(arc.GetThirdPt()) +
-               ", \"type\": " + std::to_string(arc.GetArcType()) + "}";
-        separator = ",\n    ";
+        arcs.push_back({{"start", json::Text(arc.GetStartPt())},
+                        {"end", json::Text(arc.GetEndPt())},
+                        {"third", json::Text(arc.GetThirdPt())},
+                        {"type", arc.GetArcType()}});
     }
-    out += "\n  ],\n  \"circles\": [";
-    separator = "\n    ";
+    std::vector<json::Value> circles;
     for (const UWCircle& circle : engine.GetCircleList()) {
-        out += separator;
-        out += "{\"e\": " + json::Number(circle.GetCentre().x) +
-               ", \"n\": " + json::Number(circle.GetCentre().y) +
-               ", \"radius\": " + json::Number(circle.GetRadius()) + "}";
-        separator = ",\n    ";
+        circles.push_back({{"e", circle.GetCentre().x},
+                           {"n", circle.GetCentre().y},
+                           {"radius", circle.GetRadius()}});
     }
-    out += "\n  ],\n  \"error\": " + std::to_string(engine.GetErrorCode()) + ",\n  \"messages\": [";
-    separator = "";
-    for (const std::wstring& message : messages) {
-        out += separator + json::Quote(message);
-        separator = ", ";
-    }
-    out += "]\n}\n";
+    json::Value said = json::Value::array();
+    for (const std::wstring& message : messages) said.push_back(json::Text(message));
+    const std::string out = json::Members({{"points", PointsJson(ReducedPoints(engine), 2)},
+                                           {"lines", json::Rows(lines, 2)},
+                                           {"arcs", json::Rows(arcs, 2)},
+                                           {"circles", json::Rows(circles, 2)},
+                                           {"error", std::to_string(engine.GetErrorCode())},
+                                           {"messages", json::Inline(said)}}) +
+                            "\n";
     std::fputs(out.c_str(), stdout);
 }
 
-bool CheckOutputOptions(const std::string& reportPath, bool json) {
-    if (!json || reportPath != "-") return true;
-    std::fprintf(stderr, "sxnedit: --json and --report - both want standard output\n");
-    return false;
+void CheckOutputOptions(const std::string& reportPath, bool json) {
+    if (json && reportPath == "-") {
+        throw CLI::ValidationError("--json and --report - both want standard output");
+    }
 }
 
 bool WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report,

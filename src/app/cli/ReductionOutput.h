@@ -14,8 +14,8 @@ std::vector<PointRow> ReducedPoints(const UNeditDatabase& engine);
 /// One JSON object: points, lines, arcs, circles, the engine's error code and the messages.
 void PrintJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages);
 
-/// False, with a message, when the JSON and the report would both go to standard output.
-bool CheckOutputOptions(const std::string& reportPath, bool json);
+/// Throws CLI::ValidationError when the JSON and the report would both go to standard output.
+void CheckOutputOptions(const std::string& reportPath, bool json);
 
 /// Writes what a reduction gives: the report to `reportPath` ("-" for standard output, empty
 /// for none), then the JSON, or the table of points unless the report took standard output.
