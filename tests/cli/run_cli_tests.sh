@@ -148,5 +148,47 @@ check doc-usage 64 /dev/null "" -- "$sxnedit" doc export "$work/docs.job"
 check reduce-missing 2 /dev/null "sxnedit: Failed to open $work/none.neu." -- "$sxnedit" reduce "$work/none.neu"
 check reduce-no-file 64 /dev/null "" -- "$sxnedit" reduce --json
 
+# An output never replaces an input of the same run, and a read-only file is never replaced.
+# same NAME FILE -- COMMAND...: the command is refused with a message and FILE is unchanged.
+same() {
+    local name="$1" file="$2"
+    shift 3
+    cp "$file" "$work/before"
+    "$@" >/dev/null 2>"$work/err"
+    local status=$?
+    if [ "$status" -eq 1 ] && grep -q "^sxnedit: cannot write " "$work/err" && cmp -s "$file" "$work/before"; then
+        passed=$((passed + 1))
+    else
+        echo "FAIL $name: status $status, '$(cat "$work/err")', or $file changed"; failed=$((failed + 1))
+    fi
+}
+cp "$work/small.neu" "$work/in.neu"
+same doc-export-onto-job "$work/docs.job" -- "$sxnedit" doc export "$work/docs.job" "FIELD DAY" "$work/docs.job"
+same export-points-onto-job "$work/site.job" -- "$sxnedit" job export-points "$work/site.job" "$work/site.job"
+same report-onto-input "$work/in.neu" -- "$sxnedit" reduce "$work/in.neu" --report "$work/in.neu"
+same points-onto-input "$work/in.neu" -- "$sxnedit" reduce "$work/in.neu" --points "$work/in.neu"
+ln -s in.neu "$work/link.neu"
+same points-onto-link-to-input "$work/in.neu" -- "$sxnedit" reduce "$work/link.neu" --points "$work/in.neu"
+same points-onto-job "$work/site.job" -- "$sxnedit" reduce "$work/in.neu" --job "$work/site.job" --points "$work/site.job"
+same doc-report-onto-job "$work/docs.job" -- "$sxnedit" doc reduce "$work/docs.job" "FIELD DAY" --report "$work/docs.job"
+echo kept >"$work/kept.csv" && chmod 444 "$work/kept.csv"
+same points-onto-read-only "$work/kept.csv" -- "$sxnedit" reduce "$work/in.neu" --points "$work/kept.csv"
+check read-only-message 1 /dev/null "sxnedit: cannot write $work/kept.csv: it is read-only" -- \
+    "$sxnedit" job export-points "$work/site.job" "$work/kept.csv"
+check same-file-message 1 /dev/null \
+    "sxnedit: cannot write $work/in.neu: it is the same file as $work/link.neu, which this command reads" -- \
+    "$sxnedit" reduce "$work/link.neu" --report "$work/in.neu"
+check two-outputs-one-file 1 /dev/null \
+    "sxnedit: cannot write $work/out.txt: it is the same file as $work/out.txt, which this command also writes" -- \
+    "$sxnedit" reduce "$work/in.neu" --report "$work/out.txt" --points "$work/out.txt"
+# A named pipe stays a pipe, and its reader gets the points.
+mkfifo "$work/points.fifo"
+cat "$work/points.fifo" >"$work/from-fifo" &
+reader=$!
+"$sxnedit" reduce "$work/in.neu" --points "$work/points.fifo" >/dev/null 2>&1
+wait "$reader"
+[ -p "$work/points.fifo" ] && grep -q '^P1,' "$work/from-fifo" && passed=$((passed + 1)) ||
+    { echo "FAIL points-to-fifo: the pipe was replaced or its reader got nothing"; failed=$((failed + 1)); }
+
 echo "cli: $passed passed, $failed failed"
 [ "$failed" -eq 0 ]

@@ -10,6 +10,7 @@
 #include "Commands.h"
 #include "ConsoleDialogHost.h"
 #include "ReductionOutput.h"
+#include "RunFiles.h"
 #include "document/UListCtrl.h"
 #include "document/URawDataContainer.h"
 #include "platform/job/JobError.h"
@@ -126,8 +127,8 @@ int Delete(OpenJob& open, const std::string& name) {
 struct DocOptions {
     std::string job;
     std::string name;
-    std::string other;  // a file, or the new name of a rename
-    std::string report;
+    std::string other;   // the neutral file of an import, the new name of a rename
+    std::string output;  // the file of an export, the report of a reduction
     bool json = false;
 };
 
@@ -139,6 +140,9 @@ CLI::App* AddDocCommand(CLI::App& doc, CommandRun& run, const std::shared_ptr<Do
     command->add_option("JOB", options->job, "the job file")->required();
     command->callback([options, work, &run] {
         run = [options, work] {
+            if (!RunFiles().Reads(options->job).Writes(options->output).Check()) {
+                return exit_status::Failed;
+            }
             OpenJob open;
             if (!Open(options->job, open)) return exit_status::Unreadable;
             return work(open, *options);
@@ -166,21 +170,21 @@ void AddDocCommands(CLI::App& app, CommandRun& run) {
 
     CLI::App* exported = AddDocCommand(
         *doc, run, options, "export", "write a document's records as a neutral file",
-        [](OpenJob& open, const DocOptions& o) { return Export(open, o.name, o.other); });
+        [](OpenJob& open, const DocOptions& o) { return Export(open, o.name, o.output); });
     exported->add_option("NAME", options->name, "the document")->required();
-    exported->add_option("FILE.neu", options->other, "the neutral file to write")->required();
+    exported->add_option("FILE.neu", options->output, "the neutral file to write")->required();
 
     CLI::App* reduce = AddDocCommand(
         *doc, run, options, "reduce",
         "reduce a stored document; coordinates that the run took\n"
         "from the job or the user are added to its records",
-        [](OpenJob& open, const DocOptions& o) { return Reduce(open, o.name, o.report, o.json); });
+        [](OpenJob& open, const DocOptions& o) { return Reduce(open, o.name, o.output, o.json); });
     reduce->add_option("NAME", options->name, "the document")->required();
-    reduce->add_option("--report", options->report, "write the reduction report; - prints it")
+    reduce->add_option("--report", options->output, "write the reduction report; - prints it")
         ->option_text("OUT.txt|-");
     reduce->add_flag("--json", options->json, "print the reduction's results as JSON");
     reduce->parse_complete_callback(
-        [options] { CheckOutputOptions(options->report, options->json); });
+        [options] { CheckOutputOptions(options->output, options->json); });
 
     CLI::App* rename = AddDocCommand(
         *doc, run, options, "rename", "give a document another name",

@@ -10,6 +10,7 @@
 
 #include "Commands.h"
 #include "PointOutput.h"
+#include "RunFiles.h"
 #include "platform/io/LineReader.h"
 #include "platform/job/Csv.h"
 #include "platform/job/UDBPoint.h"
@@ -189,6 +190,7 @@ int Import(const std::string& path, const std::string& file) {
 }
 
 int Export(const std::string& path, const std::string& file) {
+    if (!RunFiles().Reads(path).Writes(file).Check()) return exit_status::Failed;
     nedit::JobOpenOptions options;
     options.access = nedit::JobAccess::ReadOnly;
     auto job = USurveyDoc::OpenJob(path, options);

@@ -12,6 +12,7 @@
 #include "PointOutput.h"
 #include "RecordSession.h"
 #include "ReductionOutput.h"
+#include "RunFiles.h"
 #include "platform/job/JobError.h"
 #include "platform/job/USurveyDoc.h"
 #include "platform/text/WideText.h"
@@ -55,6 +56,14 @@ std::string CheckColumns(const std::string& columns) {
 }
 
 int Reduce(const ReduceOptions& options) {
+    if (!RunFiles()
+             .Reads(options.file)
+             .Reads(options.job)
+             .Writes(options.report)
+             .Writes(options.points_csv)
+             .Check()) {
+        return exit_status::Failed;
+    }
     std::unique_ptr<USurveyDoc> job;
     if (!options.job.empty()) {
         try {
