@@ -61,22 +61,19 @@ int List(OpenJob& open) {
 }
 
 int Import(OpenJob& open, const std::string& file, const std::string& wanted) {
-    if (!wanted.empty() && open.container->GetNeditDoc(Wide(wanted)) != nullptr) {
+    std::wstring name = Wide(wanted);
+    const int done = wanted.empty()
+                         ? open.container->CreateNEditDocFromNeutralFile(L"", Wide(file), &name)
+                         : open.container->CreateNEditDocNamed(name, Wide(file));
+    if (!done && !wanted.empty() && open.container->HasName(name)) {
         std::fprintf(stderr, "sxnedit: the job has a document %s already\n", wanted.c_str());
         return exit_status::Failed;
     }
-    std::wstring name;
-    if (!open.container->CreateNEditDocFromNeutralFile(Wide(wanted), Wide(file), &name)) {
+    if (!done) {
         std::fprintf(stderr, "sxnedit: %s could not be imported\n", file.c_str());
         return exit_status::Unreadable;
     }
-    // The import numbers its names; a name asked for is given exactly.
-    if (!wanted.empty() && !open.container->RenameNeditDoc(Wide(wanted), name)) {
-        std::fprintf(stderr, "sxnedit: the document could not be named %s\n", wanted.c_str());
-        return exit_status::Failed;
-    }
-    std::printf("Imported %s as %s.\n", file.c_str(),
-                wanted.empty() ? nedit::ToUtf8(name).c_str() : wanted.c_str());
+    std::printf("Imported %s as %s.\n", file.c_str(), nedit::ToUtf8(name).c_str());
     return exit_status::Ok;
 }
 
@@ -106,7 +103,7 @@ int Reduce(OpenJob& open, const std::string& name, const std::string& report, bo
 }
 
 int Rename(OpenJob& open, const std::string& from, const std::string& to) {
-    if (open.container->GetNeditDoc(Wide(to)) != nullptr) {
+    if (open.container->HasName(Wide(to))) {
         std::fprintf(stderr, "sxnedit: the job has a document %s already\n", to.c_str());
         return exit_status::Failed;
     }
