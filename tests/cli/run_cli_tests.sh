@@ -148,6 +148,23 @@ check doc-usage 64 /dev/null "" -- "$sxnedit" doc export "$work/docs.job"
 check reduce-missing 2 /dev/null "sxnedit: Failed to open $work/none.neu." -- "$sxnedit" reduce "$work/none.neu"
 check reduce-no-file 64 /dev/null "" -- "$sxnedit" reduce --json
 
+# One question, one answer: the JSON, the points file and the report give P1 where a hand
+# calculation puts it. The back station B is known (E 1100, N 2000), so from A (E 1000,
+# N 2000) the back bearing is 90, not the 45 of the BKB record; P1 at 90 + 90 = 180 and 100 m
+# lies at E 1000, N 1900.
+fixture="$data/back_station_overrules_bearing.neu"
+from_json=$("$sxnedit" reduce "$fixture" --json |
+    awk -F'[:,]' '/"id": "P1"/ { printf "%.3f %.3f", $4, $6 }')
+"$sxnedit" reduce "$fixture" --points "$work/one.csv" >/dev/null
+from_csv=$(awk -F, '$1 == "P1" { printf "%.3f %.3f", $2, $3 }' "$work/one.csv")
+from_report=$("$sxnedit" reduce "$fixture" --report - --columns ID,EC,NC,HC |
+    awk '$1 == "P1" { printf "%.3f %.3f", $2, $3 }')
+if [ "$from_json" = "1000.000 1900.000" ] && [ "$from_csv" = "$from_json" ] && [ "$from_report" = "$from_json" ]; then
+    passed=$((passed + 1))
+else
+    echo "FAIL one-answer: json '$from_json', points '$from_csv', report '$from_report'"; failed=$((failed + 1))
+fi
+
 # An output never replaces an input of the same run, and a read-only file is never replaced.
 # same NAME FILE -- COMMAND...: the command is refused with a message and FILE is unchanged.
 same() {

@@ -82,7 +82,7 @@ int Reduce(const ReduceOptions& options) {
     if (!options.lengths.empty()) parameters.LinearUnit = IndexOf(kLengthUnits, options.lengths);
     if (options.columns_given) SetFlagsFromOrder(parameters, nedit::FromUtf8(options.columns));
 
-    UNeditDatabase& engine = session.StartEngine(!options.report.empty());
+    UNeditDatabase& engine = session.StartEngine();
     if (!engine.LoadNeFile(nedit::FromUtf8(options.file))) {
         if (options.json) {
             for (const std::wstring& message : session.host.Messages()) {

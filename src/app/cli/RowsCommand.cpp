@@ -14,7 +14,7 @@ namespace {
 int Rows(const std::string& file) {
     RecordSession session;
     if (!session.Start()) return exit_status::Failed;
-    if (!session.StartEngine(false).LoadNeFile(nedit::FromUtf8(file))) {
+    if (!session.StartEngine().LoadNeFile(nedit::FromUtf8(file))) {
         if (session.host.Messages().empty()) {
             std::fprintf(stderr, "sxnedit: %s holds no records\n", file.c_str());
         }
