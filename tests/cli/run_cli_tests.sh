@@ -165,6 +165,15 @@ else
     echo "FAIL one-answer: json '$from_json', points '$from_csv', report '$from_report'"; failed=$((failed + 1))
 fi
 
+# A station with 100 side shots fills pages of 66 lines (the default PAGELENGTH), each after
+# the first beginning with a form feed.
+{ printf '#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nSTN ID=A,HI=1.5\nXYZ ID=A,E=0,N=0,H=0\nBKB ID=B,BRG=0,HA=0\n'
+  for i in $(seq 1 100); do printf 'SS ID=S%d,HA=%d,VA=90,SD=10,HT=1.5\n' "$i" "$i"; done; } >"$work/hundred.neu"
+"$sxnedit" reduce "$work/hundred.neu" --report - >"$work/hundred.txt" 2>/dev/null
+pages=$(awk 'BEGIN { RS = "\f" } { n = split($0, lines, "\n"); if (n > 67) long++ } END { print NR, long + 0 }' "$work/hundred.txt")
+[ "${pages#* }" = 0 ] && [ "${pages% *}" -ge 2 ] && passed=$((passed + 1)) ||
+    { echo "FAIL report-pages: pages and pages too long: $pages"; failed=$((failed + 1)); }
+
 # An output never replaces an input of the same run, and a read-only file is never replaced.
 # same NAME FILE -- COMMAND...: the command is refused with a message and FILE is unchanged.
 same() {
