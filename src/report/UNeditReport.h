@@ -56,6 +56,8 @@ class UNeditReport : public UReportDoc {
     /// Decimal degrees written " ddd mm'ss".
     static std::wstring deg2dmsString(double degrees);
     /// A horizontal angle or bearing in the output angle type: "123 45'30"" or "123.7583".
+    /// In degrees, minutes and seconds whole turns are taken off as dms carries them, so a
+    /// reading that rounds to a full turn prints as 0, never as 360.
     std::wstring FormatAngle(double degrees) const;
     /// Bearing (degrees) and distance from (e1, n1) to (e2, n2).
     static void geo_brgdst(double e1, double n1, double e2, double n2, double* brg, double* dst);
