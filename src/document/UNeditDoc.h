@@ -61,7 +61,8 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat {
     int Save(const std::wstring& path, const UListCtrl* list) const;
     /// Saves the rows of the document's list, or its last text without one.
     int SaveData() override;
-    /// Copies the stored text and the plan settings into `target`.
+    /// Copies the stored text, read line by line as a file's lines are, and the plan settings
+    /// into `target`.
     void CopyDocument(UNeditDoc& target);
 
     /// The list of the open document: made and loaded on first use.

@@ -101,3 +101,26 @@ TEST_F(RawDataContainer, ANameAnotherProgramTookIsNeverOverwritten) {
     EXPECT_EQ(later.RowsOf(numbered).at(1), L"STN       ID=B,HI=1.6");
     EXPECT_EQ(later.container->GetDocumentNames().size(), 3u);
 }
+
+TEST_F(RawDataContainer, ALatin1FileKeepsItsLettersThroughLoadSaveAndRename) {
+    Program program(dir.File("site.job"));
+    // "ÉCOLE" in Latin-1, as older field programs wrote it: no valid UTF-8.
+    const std::string latin1 =
+        "#VERSION-1.0 NEUTRAL FILE\nSTN ID=\xC9"
+        "COLE,HI=1.5\nSS ID=P1,HA=0\n";
+    ASSERT_EQ(program.container->CreateNEditDocNamed(L"OLD", File("old.neu", latin1)), 1);
+    const std::wstring station = L"STN       ID=\u00C9COLE,HI=1.5";
+    EXPECT_EQ(program.RowsOf(L"OLD").at(1), station);
+    ASSERT_EQ(program.container->GetNeditDoc(L"OLD")->SaveDocument(), 1);
+    ASSERT_TRUE(program.container->RenameNeditDoc(L"NEW", L"OLD"));
+
+    Program later(dir.File("site.job"));
+    EXPECT_EQ(later.RowsOf(L"NEW").at(1), station);
+    // Saved again, the letters are stored as UTF-8.
+    std::string stored;
+    ASSERT_TRUE(later.container->GetNeditDoc(L"NEW")->GetStorage()->ReadStream(
+        UNeditDoc::kNeutralDataStream, stored));
+    EXPECT_NE(stored.find("ID=\xC3\x89"
+                          "COLE"),
+              std::string::npos);
+}
