@@ -174,6 +174,24 @@ pages=$(awk 'BEGIN { RS = "\f" } { n = split($0, lines, "\n"); if (n > 67) long+
 [ "${pages#* }" = 0 ] && [ "${pages% *}" -ge 2 ] && passed=$((passed + 1)) ||
     { echo "FAIL report-pages: pages and pages too long: $pages"; failed=$((failed + 1)); }
 
+# A scale of 1e308 overflows every distance: the points that come out as no finite numbers
+# are named in the messages and left out of the JSON and the points file, and the run fails.
+overflow="$data/scale_overflow.neu"
+"$sxnedit" reduce "$overflow" --json >"$work/overflow.json" 2>"$work/err"
+status=$?
+"$sxnedit" reduce "$overflow" --points "$work/overflow.csv" >/dev/null 2>"$work/err-points"
+points_status=$?
+if [ "$status" -eq 1 ] && [ "$points_status" -eq 1 ] &&
+    ! grep -qiwE 'inf|nan' "$work/overflow.json" && ! grep -qE '"(e|n)": null|"P[12]"' "$work/overflow.json" &&
+    grep -q '"messages": \[".*not finite numbers (P1, P2)' "$work/overflow.json" &&
+    grep -q '^A,1000,2000,50,$' "$work/overflow.csv" && ! grep -qiwE 'inf|nan' "$work/overflow.csv" &&
+    grep -q 'P1, P2' "$work/err-points"; then
+    passed=$((passed + 1))
+else
+    echo "FAIL non-finite: status $status/$points_status"; cat "$work/overflow.json" "$work/overflow.csv" "$work/err-points"
+    failed=$((failed + 1))
+fi
+
 # An output never replaces an input of the same run, and a read-only file is never replaced.
 # same NAME FILE -- COMMAND...: the command is refused with a message and FILE is unchanged.
 same() {

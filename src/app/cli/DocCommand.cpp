@@ -95,10 +95,13 @@ int Reduce(OpenJob& open, const std::string& name, const std::string& report, bo
     const int result = doc->SetupDataBase(&list);
     // Addition points went into the rows; they are kept with the document.
     doc->SaveDocument();
-    if (!WriteReductionOutput(*doc->GetDatabase(), doc->GetNReport(), report, json,
-                              open.host.Messages(), doc->GetSettings().GetLengthDecimals())) {
-        return exit_status::Failed;
-    }
+    ReductionOutputs outputs;
+    outputs.report = report;
+    outputs.json = json;
+    outputs.decimals = doc->GetSettings().GetLengthDecimals();
+    const int status =
+        WriteReductionOutput(*doc->GetDatabase(), doc->GetNReport(), outputs, open.host);
+    if (status != exit_status::Ok) return status;
     return result == 1 ? exit_status::Ok : exit_status::Failed;
 }
 

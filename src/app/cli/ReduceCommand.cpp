@@ -9,7 +9,6 @@
 #include <vector>
 
 #include "Commands.h"
-#include "PointOutput.h"
 #include "RecordSession.h"
 #include "ReductionOutput.h"
 #include "RunFiles.h"
@@ -92,14 +91,13 @@ int Reduce(const ReduceOptions& options) {
         return exit_status::Unreadable;
     }
     const int result = engine.Process();
-    if (!WriteReductionOutput(engine, session.report.get(), options.report, options.json,
-                              session.host.Messages(),
-                              session.doc->GetSettings().GetLengthDecimals())) {
-        return exit_status::Failed;
-    }
-    if (!options.points_csv.empty() && !WritePointsCsv(options.points_csv, ReducedPoints(engine))) {
-        return exit_status::Failed;
-    }
+    ReductionOutputs outputs;
+    outputs.report = options.report;
+    outputs.points = options.points_csv;
+    outputs.json = options.json;
+    outputs.decimals = session.doc->GetSettings().GetLengthDecimals();
+    const int status = WriteReductionOutput(engine, session.report.get(), outputs, session.host);
+    if (status != exit_status::Ok) return status;
     return result == 1 ? exit_status::Ok : exit_status::Failed;
 }
 

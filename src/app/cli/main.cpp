@@ -16,7 +16,8 @@ const char* const kDescription = "Reads total-station observations held as neutr
 
 const char* const kFooter =
     "Run 'sxnedit COMMAND --help' for the options of a command.\n"
-    "Exit status: 0 done, 1 failed (for reduce: the run did not reach its end),\n"
+    "Exit status: 0 done, 1 failed (an output refused; for reduce also: the run did\n"
+    "not reach its end, or points that are no finite numbers were left out),\n"
     "2 an input file could not be read, 64 the command line is wrong.\n"
     "Environment: SXNEDIT_DATA_DIR names the directory of the record definition.";
 
