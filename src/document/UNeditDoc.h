@@ -95,6 +95,7 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat {
 
     // ---- Plain access ---------------------------------------------------------------------------
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
+    UDocument* GetParent() const { return ParentDoc; }
     USurveyDoc* GetSurveyDocument() const override { return SurveyDoc; }
     const UJobSettings& GetSettings() const { return Settings; }
     UNeditSettings& GetNeditSettings() { return NeditSettings; }

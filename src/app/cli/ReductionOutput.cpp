@@ -53,7 +53,9 @@ bool TellNonFinite(const UNeditDatabase& engine, ConsoleDialogHost& host) {
     return points + circles > 0;
 }
 
-void PrintJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages) {
+}  // namespace
+
+std::string ReductionJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages) {
     std::vector<json::Value> lines;
     for (const UNeditLine& line : engine.GetLineList()) {
         lines.push_back({{"from", json::Text(line.GetFromPt())},
@@ -76,17 +78,14 @@ void PrintJson(const UNeditDatabase& engine, const std::vector<std::wstring>& me
     }
     json::Value said = json::Value::array();
     for (const std::wstring& message : messages) said.push_back(json::Text(message));
-    const std::string out = json::Members({{"points", PointsJson(ReducedPoints(engine), 2)},
-                                           {"lines", json::Rows(lines, 2)},
-                                           {"arcs", json::Rows(arcs, 2)},
-                                           {"circles", json::Rows(circles, 2)},
-                                           {"error", std::to_string(engine.GetErrorCode())},
-                                           {"messages", json::Inline(said)}}) +
-                            "\n";
-    std::fputs(out.c_str(), stdout);
+    return json::Members({{"points", PointsJson(ReducedPoints(engine), 2)},
+                          {"lines", json::Rows(lines, 2)},
+                          {"arcs", json::Rows(arcs, 2)},
+                          {"circles", json::Rows(circles, 2)},
+                          {"error", std::to_string(engine.GetErrorCode())},
+                          {"messages", json::Inline(said)}}) +
+           "\n";
 }
-
-}  // namespace
 
 std::vector<PointRow> ReducedPoints(const UNeditDatabase& engine) {
     std::vector<PointRow> points;
@@ -118,7 +117,7 @@ int WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* repor
         return exit_status::Failed;
     }
     if (outputs.json) {
-        PrintJson(engine, host.Messages());
+        std::fputs(ReductionJson(engine, host.Messages()).c_str(), stdout);
     } else if (outputs.report != "-") {
         std::fputs(PointsTable(ReducedPoints(engine), outputs.decimals).c_str(), stdout);
     }

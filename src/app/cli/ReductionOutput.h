@@ -20,6 +20,10 @@ class UNeditReport;
 /// point store.
 std::vector<PointRow> ReducedPoints(const UNeditDatabase& engine);
 
+/// One JSON object: points, lines, arcs, circles (those with finite numbers), the engine's
+/// error code and the messages.
+std::string ReductionJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages);
+
 /// Throws CLI::ValidationError when the JSON and the report would both go to standard output.
 void CheckOutputOptions(const std::string& reportPath, bool json);
 
