@@ -1,5 +1,6 @@
 // kill -9 at random moments of the commands that change a job: afterwards the job passes
 // PRAGMA integrity_check and holds the state before the command or the state after it, whole.
+// And two programs importing into one job at once: each document keeps a name of its own.
 // The program under test is the sxnedit that the build made (SXNEDIT_PROGRAM), or another one
 // named by the variable of that name.
 
@@ -15,6 +16,7 @@
 #include <fstream>
 #include <functional>
 #include <random>
+#include <set>
 #include <string>
 #include <thread>
 #include <vector>
@@ -161,4 +163,29 @@ TEST_F(CrashSafety, JobImportPoints) {
     const std::string job = dir.File("before.job");
     ASSERT_EQ(RunToEnd({"job", "new", job}), 0);
     KillAtRandom(job, {"job", "import-points", dir.File("work.job"), dir.File("points.csv")});
+}
+
+TEST_F(CrashSafety, TwoImportsAtOnceTakeTwoNames) {
+    const std::string job = dir.File("shared.job");
+    ASSERT_EQ(RunToEnd({"job", "new", job}), 0);
+    for (int attempt = 0; attempt < 3; ++attempt) {
+        const pid_t first = Start({"doc", "import", job, dir.File("field.neu")});
+        const pid_t second = Start({"doc", "import", job, dir.File("field.neu")});
+        for (const pid_t child : {first, second}) {
+            int status = 0;
+            waitpid(child, &status, 0);
+            EXPECT_TRUE(WIFEXITED(status) && WEXITSTATUS(status) == 0);
+        }
+    }
+    // Six documents of one content, each under a name of its own.
+    const std::vector<std::string> state = StateOf(job);
+    std::set<std::string> names;
+    std::set<std::string> contents;
+    for (const std::string& row : state) {
+        if (row.find("|NeutralData|") == std::string::npos) continue;
+        names.insert(row.substr(0, row.find('|')));
+        contents.insert(row.substr(row.find("|NeutralData|")));
+    }
+    EXPECT_EQ(names.size(), 6u);
+    EXPECT_EQ(contents.size(), 1u);
 }
