@@ -7,11 +7,16 @@ BUILD_DIR="${SXNEDIT_BUILD_DIR:-$ROOT/build}"
 
 # Debian packages the build and the tests need.
 PACKAGES=(g++ cmake ninja-build pkg-config libgtest-dev libgmock-dev libbenchmark-dev
-          libsqlite3-dev python3)
+          libsqlite3-dev libcli11-dev nlohmann-json3-dev python3)
+# And the build under the sanitizers, with the fuzz targets (scripts/test-sanitizers).
+SANITIZER_PACKAGES=(clang libclang-rt-dev)
 
+# Installs the packages named, or PACKAGES, that are not installed yet.
 install_missing_packages() {
+    local wanted=("$@")
+    [ ${#wanted[@]} -eq 0 ] && wanted=("${PACKAGES[@]}")
     local missing=()
-    for pkg in "${PACKAGES[@]}"; do
+    for pkg in "${wanted[@]}"; do
         dpkg-query -W -f='${Status}' "$pkg" 2>/dev/null | grep -q "ok installed" || missing+=("$pkg")
     done
     [ ${#missing[@]} -eq 0 ] && return 0

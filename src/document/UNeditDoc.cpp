@@ -147,9 +147,11 @@ int UNeditDoc::SaveData() {
 
 void UNeditDoc::CopyDocument(UNeditDoc& target) {
     UStorage* storage = GetStorage();
-    std::string bytes;
-    if (storage != nullptr && storage->ReadStream(kNeutralDataStream, bytes))
-        target.NeuText += nedit::FromUtf8(bytes);
+    UStreamFile stream;
+    if (storage != nullptr && stream.OpenStream(*storage, kNeutralDataStream, kReadMode)) {
+        for (std::wstring line; stream.ReadString(line);) target.NeuText += line + L"\n";
+        stream.Abort();
+    }
     target.NeditSettings = NeditSettings;
 }
 

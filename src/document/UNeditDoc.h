@@ -68,7 +68,8 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     int Save(const std::wstring& path, const UListCtrl* list) const;
     /// Saves the rows of the document's list, or its last text without one.
     int SaveData() override;
-    /// Copies the stored text and the plan settings into `target`.
+    /// Copies the stored text, read line by line as a file's lines are, and the plan settings
+    /// into `target`.
     void CopyDocument(UNeditDoc& target);
 
     /// The list of the open document: made and loaded on first use.
@@ -107,6 +108,7 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
 
     // ---- Plain access ---------------------------------------------------------------------------
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
+    UDocument* GetParent() const { return ParentDoc; }
     USurveyDoc* GetSurveyDocument() const override { return SurveyDoc; }
     const UJobSettings& GetSettings() const override { return Settings; }
     const UNeutralFileFormat& GetRecordFormat() const override { return *this; }

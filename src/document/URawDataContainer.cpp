@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "platform/io/LineReader.h"
+#include "platform/job/UDBSQLiteTransaction.h"
 #include "platform/job/USurveyDoc.h"
 #include "platform/storage/UStreamFile.h"
 #include "platform/text/Format.h"
@@ -28,7 +29,12 @@ int URawDataContainer::Open() {
 int URawDataContainer::OpenDocument(const std::wstring& name, UDocument* job) {
     Documents.clear();
     if (!UDocument::OpenDocument(name, job)) {
-        if (!UDocument::CreateDocument(name, job) || !Commit()) return 0;
+        // Made under the write lock, so that two programs opening a new job at once do not
+        // each make one, the second replacing the first with what was stored in it.
+        if (job == nullptr || job->GetStorage() == nullptr) return 0;
+        UDBSQLiteTransaction transaction(*job->GetStorage()->GetJob());
+        if (!UDocument::OpenDocument(name, job) && !UDocument::CreateDocument(name, job)) return 0;
+        transaction.Commit();
     }
     for (const UStorageElement& element : GetStorage()->EnumElements()) {
         if (element.Type != UStorageElement::kStorage) continue;
@@ -80,24 +86,45 @@ int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseNam
                                                      const std::wstring& path,
                                                      std::wstring* createdName) {
     const std::wstring base = baseName.empty() ? std::wstring(L"Data") : baseName;
-    const int number = FirstFreeNumber(base, kNameLimit);
-    if (number >= kNameLimit || GetStorage() == nullptr) return 0;
-    const std::wstring name = nedit::Format(L"%s%d", base, number);
+    return StoreNeutralFile(
+        path,
+        [this, &base] {
+            const int number = FirstFreeNumber(base, kNameLimit);
+            return number < kNameLimit ? nedit::Format(L"%s%d", base, number) : std::wstring();
+        },
+        createdName);
+}
 
+int URawDataContainer::CreateNEditDocNamed(const std::wstring& name, const std::wstring& path) {
+    return StoreNeutralFile(
+        path, [this, &name] { return HasName(name) ? std::wstring() : name; }, nullptr);
+}
+
+int URawDataContainer::StoreNeutralFile(const std::wstring& path,
+                                        const std::function<std::wstring()>& chooseName,
+                                        std::wstring* createdName) {
+    if (GetStorage() == nullptr) return 0;
+    // The file is read before the job is locked, so that other programs wait only for the
+    // writing.
     nedit::LineReader reader;
     if (!reader.Open(nedit::ToUtf8(path))) return 0;
+    std::string text;
+    for (std::string line; reader.ReadLine(line);) {
+        if (nedit::TrimView(nedit::DecodeTextLine(line)).empty()) continue;
+        text += line;
+        text += '\n';
+    }
+
+    UDBSQLiteTransaction transaction(*GetStorage()->GetJob());
+    const std::wstring name = chooseName();
+    if (name.empty()) return 0;
     UStorage storage;
     if (!storage.Create(*GetStorage(), name, kNewDocumentMode)) return 0;
     UStreamFile stream;
     if (!stream.CreateStream(storage, UNeditDoc::kNeutralDataStream, UNeditDoc::kCreateMode)) {
-        storage.Release();
         return 0;
     }
-    for (std::string line; reader.ReadLine(line);) {
-        if (nedit::TrimView(nedit::DecodeTextLine(line)).empty()) continue;
-        stream.Write(line.data(), line.size());
-        stream.Write("\n", 1);
-    }
+    stream.Write(text.data(), text.size());
     stream.Close();
     UStreamFile settings;
     if (settings.CreateStream(storage, UNeditDoc::kSettingsStream, UNeditDoc::kCreateMode)) {
@@ -107,6 +134,7 @@ int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseNam
     }
     if (!storage.Commit() || !Commit(nedit::stgc::OnlyIfCurrent)) return 0;
     storage.Release();
+    transaction.Commit();
 
     auto doc = std::make_unique<UNeditDoc>(Job);
     if (!doc->OpenDocument(name, this)) return 0;
@@ -126,17 +154,23 @@ bool URawDataContainer::DeleteNeditDoc(const std::wstring& name) {
 
 bool URawDataContainer::RenameNeditDoc(const std::wstring& newName, const std::wstring& oldName,
                                        int /*flag*/) {
-    if (GetNeditDoc(newName) != nullptr) return false;
     UNeditDoc* old_doc = GetNeditDoc(oldName);
-    if (old_doc == nullptr) return false;
+    if (old_doc == nullptr || GetStorage() == nullptr) return false;
+    UDBSQLiteTransaction transaction(*GetStorage()->GetJob());
+    if (HasName(newName)) return false;
     if (old_doc->GetModified()) old_doc->SaveData();
     auto renamed = std::make_unique<UNeditDoc>(Job);
     renamed->SetCreateReport(false);
     if (!renamed->CreateDocument(newName, this)) return false;
     old_doc->CopyDocument(*renamed);
-    if (!renamed->SaveAsDocument(newName)) return false;
+    if (!renamed->SaveAsDocument(newName) || !Delete(oldName) || !Commit()) return false;
+    transaction.Commit();
+    // Only what the job now holds is shown.
+    old_doc->CloseDocument();
+    Documents.erase(std::find_if(Documents.begin(), Documents.end(),
+                                 [old_doc](const auto& doc) { return doc.get() == old_doc; }));
     Adopt(std::move(renamed));
-    return DeleteNeditDoc(oldName) && Commit();
+    return true;
 }
 
 void URawDataContainer::CopyDocument(URawDataContainer& target, USurveyDoc* targetSurvey) {

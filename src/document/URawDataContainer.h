@@ -1,7 +1,17 @@
 #pragma once
 // All raw-data documents of a job: one child storage each, under the storage "RawData" of
 // the job file.
+//
+// Decisions:
+// - A document comes into being with its streams in one transaction of the job, and a
+//   rename is one transaction: after a crash at any moment the job holds the old state or
+//   the new one, never an empty document or two copies.
+// - A name is chosen inside the same write transaction that makes the storage, against the
+//   names in the job file as they are then, not as this container saw them when it opened:
+//   another program may have stored a document since. A name taken by then is refused (or,
+//   for a numbered name, the next free one taken); a document is never overwritten.
 
+#include <functional>
 #include <memory>
 #include <set>
 #include <string>
@@ -38,9 +48,15 @@ class URawDataContainer : public UDocument {
     /// free below 1024, or the file or the storage cannot be had.
     int CreateNEditDocFromNeutralFile(const std::wstring& baseName, const std::wstring& path,
                                       std::wstring* createdName = nullptr);
+    /// Makes a document of a neutral file, as CreateNEditDocFromNeutralFile does, under exactly
+    /// `name`. 0 when that name is taken (see HasName), or the file or the storage cannot be had.
+    int CreateNEditDocNamed(const std::wstring& name, const std::wstring& path);
+    /// True when a document or another element of the container has the name, in this
+    /// container or, since it was opened, in the job file.
+    bool HasName(const std::wstring& name) const { return TakenNames().count(name) != 0; }
     bool DeleteNeditDoc(const std::wstring& name);
-    /// Gives the document `oldName` the name `newName`; false when `newName` is taken or
-    /// `oldName` does not exist.
+    /// Gives the document `oldName` the name `newName`, in one transaction; false when
+    /// `newName` is taken (see HasName) or `oldName` does not exist.
     bool RenameNeditDoc(const std::wstring& newName, const std::wstring& oldName, int flag = 0);
     /// Copies every document into `target`, a container of `targetSurvey`.
     void CopyDocument(URawDataContainer& target, USurveyDoc* targetSurvey);
@@ -51,6 +67,10 @@ class URawDataContainer : public UDocument {
     /// The lowest number from 1 that makes `base` and it a free name; `last` when none below.
     int FirstFreeNumber(const std::wstring& base, int last) const;
     UNeditDoc* Adopt(std::unique_ptr<UNeditDoc> doc);
+    /// Stores the lines of the file at `path` as a new document, named by `chooseName` inside
+    /// the write transaction (empty: no name is free); 1 when done.
+    int StoreNeutralFile(const std::wstring& path, const std::function<std::wstring()>& chooseName,
+                         std::wstring* createdName);
 
     USurveyDoc* Job;
     std::vector<std::unique_ptr<UNeditDoc>> Documents;

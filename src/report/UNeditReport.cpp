@@ -50,6 +50,14 @@ void CarrySexagesimal(long& d, long& m, long& s) {
     if (d > 359) d %= 360;
 }
 
+// The angle less the whole turns it holds once rounded to the second, as the carries of dms
+// take them off: 359°59'59.6" is a full turn and shows as 0, not as 360.
+double WithoutFullTurns(double degrees) {
+    const double size = std::fabs(degrees);
+    const double turns = std::floor(std::round(size * 3600.0) / (360.0 * 3600.0));
+    return std::copysign(size - turns * 360.0, degrees);
+}
+
 bool IsFeet(wchar_t unit) {
     return unit == L'1' || unit == L'F' || unit == L'I';
 }
@@ -230,6 +238,7 @@ int UNeditReport::AngleType() const {
 
 std::wstring UNeditReport::FormatAngle(double degrees) const {
     const int type = AngleType();
+    if (type == 0) degrees = WithoutFullTurns(degrees);
     std::wstring text =
         UFormatAngle(type, 4, 0).ConvertToDisplayString(nedit::Format(L"%f", degrees));
     if (type != 0 || text.size() < 2) return text;

@@ -57,6 +57,8 @@ class UNeditReport : public UReportDoc {
     /// Decimal degrees written " ddd mm'ss".
     static std::wstring deg2dmsString(double degrees);
     /// A horizontal angle or bearing in the output angle type: "123 45'30"" or "123.7583".
+    /// In degrees, minutes and seconds whole turns are taken off as dms carries them, so a
+    /// reading that rounds to a full turn prints as 0, never as 360.
     std::wstring FormatAngle(double degrees) const;
     /// The platform's nedit::geo_brgdst: bearing (degrees) and distance from (e1, n1) to
     /// (e2, n2).

@@ -55,6 +55,17 @@ check version 0 "$work/version" "" -- "$sxnedit" --version
 "$sxnedit" --help >"$work/help"
 grep -q '^Usage: sxnedit COMMAND' "$work/help" && grep -q 'rows FILE.neu' "$work/help" &&
     passed=$((passed + 1)) || { echo "FAIL help: usage text incomplete"; failed=$((failed + 1)); }
+# Every command has a help of its own, and a wrong command line is told with the usage of
+# the command it was meant for.
+"$sxnedit" doc import --help >"$work/help"
+grep -q '^Usage: sxnedit doc import JOB FILE.neu \[OPTIONS\]$' "$work/help" && grep -q -- '--name NAME' "$work/help" &&
+    passed=$((passed + 1)) || { echo "FAIL command-help: doc import --help incomplete"; failed=$((failed + 1)); }
+check command-usage 64 /dev/null "sxnedit: reduce: --angles: rad not in {dms,deg,gon}
+Usage: sxnedit reduce FILE.neu [OPTIONS]
+Run 'sxnedit reduce --help' for more information." -- "$sxnedit" reduce "$work/none.neu" --angles rad
+check group-usage 64 /dev/null "sxnedit: job: a command is needed
+Usage: sxnedit job COMMAND [ARGUMENTS]
+Run 'sxnedit job --help' for more information." -- "$sxnedit" job
 
 # A closed traverse observed exactly from known coordinates: every reduced point lies within
 # 0.001 of the coordinates it was generated from.
@@ -110,5 +121,91 @@ check doc-delete-missing 1 /dev/null "sxnedit: the job has no document NONE" -- 
 check doc-usage 64 /dev/null "" -- "$sxnedit" doc export "$work/docs.job"
 check reduce-missing 2 /dev/null "sxnedit: Failed to open $work/none.neu." -- "$sxnedit" reduce "$work/none.neu"
 check reduce-no-file 64 /dev/null "" -- "$sxnedit" reduce --json
+
+# One question, one answer: the JSON, the points file and the report give P1 where a hand
+# calculation puts it. The back station B is known (E 1100, N 2000), so from A (E 1000,
+# N 2000) the back bearing is 90, not the 45 of the BKB record; P1 at 90 + 90 = 180 and 100 m
+# lies at E 1000, N 1900.
+fixture="$data/back_station_overrules_bearing.neu"
+from_json=$("$sxnedit" reduce "$fixture" --json |
+    awk -F'[:,]' '/"id": "P1"/ { printf "%.3f %.3f", $4, $6 }')
+"$sxnedit" reduce "$fixture" --points "$work/one.csv" >/dev/null
+from_csv=$(awk -F, '$1 == "P1" { printf "%.3f %.3f", $2, $3 }' "$work/one.csv")
+from_report=$("$sxnedit" reduce "$fixture" --report - --columns ID,EC,NC,HC |
+    awk '$1 == "P1" { printf "%.3f %.3f", $2, $3 }')
+if [ "$from_json" = "1000.000 1900.000" ] && [ "$from_csv" = "$from_json" ] && [ "$from_report" = "$from_json" ]; then
+    passed=$((passed + 1))
+else
+    echo "FAIL one-answer: json '$from_json', points '$from_csv', report '$from_report'"; failed=$((failed + 1))
+fi
+
+# A station with 100 side shots fills pages of 66 lines (the default PAGELENGTH), each after
+# the first beginning with a form feed.
+{ printf '#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nSTN ID=A,HI=1.5\nXYZ ID=A,E=0,N=0,H=0\nBKB ID=B,BRG=0,HA=0\n'
+  for i in $(seq 1 100); do printf 'SS ID=S%d,HA=%d,VA=90,SD=10,HT=1.5\n' "$i" "$i"; done; } >"$work/hundred.neu"
+"$sxnedit" reduce "$work/hundred.neu" --report - >"$work/hundred.txt" 2>/dev/null
+pages=$(awk 'BEGIN { RS = "\f" } { n = split($0, lines, "\n"); if (n > 67) long++ } END { print NR, long + 0 }' "$work/hundred.txt")
+[ "${pages#* }" = 0 ] && [ "${pages% *}" -ge 2 ] && passed=$((passed + 1)) ||
+    { echo "FAIL report-pages: pages and pages too long: $pages"; failed=$((failed + 1)); }
+
+# A scale of 1e308 overflows every distance: the points that come out as no finite numbers
+# are named in the messages and left out of the JSON and the points file, and the run fails.
+overflow="$data/scale_overflow.neu"
+"$sxnedit" reduce "$overflow" --json >"$work/overflow.json" 2>"$work/err"
+status=$?
+"$sxnedit" reduce "$overflow" --points "$work/overflow.csv" >/dev/null 2>"$work/err-points"
+points_status=$?
+if [ "$status" -eq 1 ] && [ "$points_status" -eq 1 ] &&
+    ! grep -qiwE 'inf|nan' "$work/overflow.json" && ! grep -qE '"(e|n)": null|"P[12]"' "$work/overflow.json" &&
+    grep -q '"messages": \[".*not finite numbers (P1, P2)' "$work/overflow.json" &&
+    grep -q '^A,1000,2000,50,$' "$work/overflow.csv" && ! grep -qiwE 'inf|nan' "$work/overflow.csv" &&
+    grep -q 'P1, P2' "$work/err-points"; then
+    passed=$((passed + 1))
+else
+    echo "FAIL non-finite: status $status/$points_status"; cat "$work/overflow.json" "$work/overflow.csv" "$work/err-points"
+    failed=$((failed + 1))
+fi
+
+# An output never replaces an input of the same run, and a read-only file is never replaced.
+# same NAME FILE -- COMMAND...: the command is refused with a message and FILE is unchanged.
+same() {
+    local name="$1" file="$2"
+    shift 3
+    cp "$file" "$work/before"
+    "$@" >/dev/null 2>"$work/err"
+    local status=$?
+    if [ "$status" -eq 1 ] && grep -q "^sxnedit: cannot write " "$work/err" && cmp -s "$file" "$work/before"; then
+        passed=$((passed + 1))
+    else
+        echo "FAIL $name: status $status, '$(cat "$work/err")', or $file changed"; failed=$((failed + 1))
+    fi
+}
+cp "$work/small.neu" "$work/in.neu"
+same doc-export-onto-job "$work/docs.job" -- "$sxnedit" doc export "$work/docs.job" "FIELD DAY" "$work/docs.job"
+same export-points-onto-job "$work/site.job" -- "$sxnedit" job export-points "$work/site.job" "$work/site.job"
+same report-onto-input "$work/in.neu" -- "$sxnedit" reduce "$work/in.neu" --report "$work/in.neu"
+same points-onto-input "$work/in.neu" -- "$sxnedit" reduce "$work/in.neu" --points "$work/in.neu"
+ln -s in.neu "$work/link.neu"
+same points-onto-link-to-input "$work/in.neu" -- "$sxnedit" reduce "$work/link.neu" --points "$work/in.neu"
+same points-onto-job "$work/site.job" -- "$sxnedit" reduce "$work/in.neu" --job "$work/site.job" --points "$work/site.job"
+same doc-report-onto-job "$work/docs.job" -- "$sxnedit" doc reduce "$work/docs.job" "FIELD DAY" --report "$work/docs.job"
+echo kept >"$work/kept.csv" && chmod 444 "$work/kept.csv"
+same points-onto-read-only "$work/kept.csv" -- "$sxnedit" reduce "$work/in.neu" --points "$work/kept.csv"
+check read-only-message 1 /dev/null "sxnedit: cannot write $work/kept.csv: it is read-only" -- \
+    "$sxnedit" job export-points "$work/site.job" "$work/kept.csv"
+check same-file-message 1 /dev/null \
+    "sxnedit: cannot write $work/in.neu: it is the same file as $work/link.neu, which this command reads" -- \
+    "$sxnedit" reduce "$work/link.neu" --report "$work/in.neu"
+check two-outputs-one-file 1 /dev/null \
+    "sxnedit: cannot write $work/out.txt: it is the same file as $work/out.txt, which this command also writes" -- \
+    "$sxnedit" reduce "$work/in.neu" --report "$work/out.txt" --points "$work/out.txt"
+# A named pipe stays a pipe, and its reader gets the points.
+mkfifo "$work/points.fifo"
+cat "$work/points.fifo" >"$work/from-fifo" &
+reader=$!
+"$sxnedit" reduce "$work/in.neu" --points "$work/points.fifo" >/dev/null 2>&1
+wait "$reader"
+[ -p "$work/points.fifo" ] && grep -q '^P1,' "$work/from-fifo" && passed=$((passed + 1)) ||
+    { echo "FAIL points-to-fifo: the pipe was replaced or its reader got nothing"; failed=$((failed + 1)); }
 
 finish cli

@@ -23,7 +23,6 @@ TEST_F(ReportValues, AnglesInEveryOutputForm) {
     EXPECT_EQ(UNeditReport::deg2dmsString(10.5), L"  10 30'00");
     EXPECT_EQ(UNeditReport::deg2dmsString(-10.5), L"- 10 30'00");
     EXPECT_EQ(report->FormatAngle(123.7583333333), L"123 45'30\"");
-    EXPECT_EQ(report->FormatAngle(359.9999999), L"360 00'00\"");
 
     // Decimal degrees and gons print their digits two and two, without carries.
     doc->GetOutputParameters().AngularUnit = 1;
@@ -41,6 +40,31 @@ TEST_F(ReportValues, AnglesInEveryOutputForm) {
     doc->ProcessRecord(105, L"AMODE HM=A,VM=N", fields);
     EXPECT_NEAR(report->ConvertToDisplayVA(95.0), 85.0 * 400.0 / 360.0, 1e-12);
 }
+
+struct FullTurnCase {
+    double degrees;
+    const wchar_t* shown;
+};
+
+class FullTurnReadings : public ReportFixture,
+                         public ::testing::WithParamInterface<FullTurnCase> {};
+
+// Seconds are rounded to the whole second: 359°59'59.5" and more is a full turn, which reads
+// as 0 as on the instrument's circle; 359.99986° is 359°59'59.496".
+TEST_P(FullTurnReadings, AReadingThatRoundsToAFullTurnPrintsAsNought) {
+    Open("");
+    EXPECT_EQ(report->FormatAngle(GetParam().degrees), GetParam().shown);
+}
+
+INSTANTIATE_TEST_SUITE_P(ReportValues, FullTurnReadings,
+                         ::testing::Values(FullTurnCase{359.9999999, L"0 00'00\""},
+                                           FullTurnCase{359.99987, L"0 00'00\""},
+                                           FullTurnCase{359.99986, L"359 59'59\""},
+                                           FullTurnCase{360.0, L"0 00'00\""},
+                                           FullTurnCase{360.5, L"0 30'00\""},
+                                           FullTurnCase{-0.0000001, L"0 00'00\""},
+                                           FullTurnCase{-359.9999999, L"0 00'00\""},
+                                           FullTurnCase{-10.5, L"-10 30'00\""}));
 
 TEST_F(ReportValues, LengthsAreaAndBearings) {
     Open("");

@@ -1,9 +1,13 @@
 #pragma once
-// The commands of the sxnedit program. Each takes the arguments after its name and gives
-// the process exit status.
+// The commands of the sxnedit program. Each adds itself to the command line with its
+// arguments and options; when it is the command given, it leaves in `run` the work to do,
+// which gives the process exit status.
 
-#include <string>
-#include <vector>
+#include <functional>
+
+namespace CLI {
+class App;
+}
 
 namespace exit_status {
 constexpr int Ok = 0;
@@ -12,10 +16,12 @@ constexpr int Unreadable = 2;  // an input file could not be read
 constexpr int Usage = 64;      // the command line itself is wrong
 }  // namespace exit_status
 
-int RunRows(const std::vector<std::string>& args);
-int RunReduce(const std::vector<std::string>& args);
-int RunDoc(const std::vector<std::string>& args);
-int RunJob(const std::vector<std::string>& args);
-int RunInstruments(const std::vector<std::string>& args);
-int RunImport(const std::vector<std::string>& args);
-int RunDownload(const std::vector<std::string>& args);
+using CommandRun = std::function<int()>;
+
+void AddRowsCommand(CLI::App& app, CommandRun& run);
+void AddReduceCommand(CLI::App& app, CommandRun& run);
+void AddJobCommands(CLI::App& app, CommandRun& run);
+void AddDocCommands(CLI::App& app, CommandRun& run);
+void AddInstrumentsCommand(CLI::App& app, CommandRun& run);
+void AddImportCommand(CLI::App& app, CommandRun& run);
+void AddDownloadCommand(CLI::App& app, CommandRun& run);

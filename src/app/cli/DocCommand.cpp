@@ -1,6 +1,8 @@
 // sxnedit doc ...: the raw-data documents stored in a job.
 
+#include <CLI/CLI.hpp>
 #include <cstdio>
+#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
@@ -8,6 +10,7 @@
 #include "Commands.h"
 #include "ConsoleDialogHost.h"
 #include "ReductionOutput.h"
+#include "RunFiles.h"
 #include "document/UListCtrl.h"
 #include "document/URawDataContainer.h"
 #include "platform/job/JobError.h"
@@ -17,12 +20,6 @@
 #include "report/NeditIni.h"
 
 namespace {
-
-const char* const kDocUsage =
-    "sxnedit: doc takes one of: list JOB, import JOB FILE.neu [--name NAME], export JOB NAME "
-    "FILE.neu,\n"
-    "reduce JOB NAME [--report OUT|-] [--json], rename JOB OLD NEW, delete JOB NAME (see sxnedit "
-    "--help)\n";
 
 std::wstring Wide(const std::string& text) {
     return nedit::FromUtf8(text);
@@ -64,22 +61,19 @@ int List(OpenJob& open) {
 }
 
 int Import(OpenJob& open, const std::string& file, const std::string& wanted) {
-    if (!wanted.empty() && open.container->GetNeditDoc(Wide(wanted)) != nullptr) {
+    std::wstring name = Wide(wanted);
+    const int done = wanted.empty()
+                         ? open.container->CreateNEditDocFromNeutralFile(L"", Wide(file), &name)
+                         : open.container->CreateNEditDocNamed(name, Wide(file));
+    if (!done && !wanted.empty() && open.container->HasName(name)) {
         std::fprintf(stderr, "sxnedit: the job has a document %s already\n", wanted.c_str());
         return exit_status::Failed;
     }
-    std::wstring name;
-    if (!open.container->CreateNEditDocFromNeutralFile(Wide(wanted), Wide(file), &name)) {
+    if (!done) {
         std::fprintf(stderr, "sxnedit: %s could not be imported\n", file.c_str());
         return exit_status::Unreadable;
     }
-    // The import numbers its names; a name asked for is given exactly.
-    if (!wanted.empty() && !open.container->RenameNeditDoc(Wide(wanted), name)) {
-        std::fprintf(stderr, "sxnedit: the document could not be named %s\n", wanted.c_str());
-        return exit_status::Failed;
-    }
-    std::printf("Imported %s as %s.\n", file.c_str(),
-                wanted.empty() ? nedit::ToUtf8(name).c_str() : wanted.c_str());
+    std::printf("Imported %s as %s.\n", file.c_str(), nedit::ToUtf8(name).c_str());
     return exit_status::Ok;
 }
 
@@ -93,36 +87,26 @@ int Export(OpenJob& open, const std::string& name, const std::string& file) {
     return exit_status::Ok;
 }
 
-int Reduce(OpenJob& open, const std::vector<std::string>& args) {
-    std::string report;
-    bool json = false;
-    for (std::size_t i = 2; i < args.size(); ++i) {
-        if (args[i] == "--json") {
-            json = true;
-        } else if (args[i] == "--report" && i + 1 < args.size()) {
-            report = args[++i];
-        } else {
-            std::fputs(kDocUsage, stderr);
-            return exit_status::Usage;
-        }
-    }
-    if (!CheckOutputOptions(report, json)) return exit_status::Usage;
-    UNeditDoc* doc = Find(open, args[1]);
+int Reduce(OpenJob& open, const std::string& name, const std::string& report, bool json) {
+    UNeditDoc* doc = Find(open, name);
     if (doc == nullptr) return exit_status::Failed;
     open.host.SetEcho(!json);
     UListCtrl& list = doc->OpenList();
     const int result = doc->SetupDataBase(&list);
     // Addition points went into the rows; they are kept with the document.
     doc->SaveDocument();
-    if (!WriteReductionOutput(*doc->GetDatabase(), doc->GetNReport(), report, json,
-                              open.host.Messages(), doc->GetSettings().GetLengthDecimals())) {
-        return exit_status::Failed;
-    }
+    ReductionOutputs outputs;
+    outputs.report = report;
+    outputs.json = json;
+    outputs.decimals = doc->GetSettings().GetLengthDecimals();
+    const int status =
+        WriteReductionOutput(*doc->GetDatabase(), doc->GetNReport(), outputs, open.host);
+    if (status != exit_status::Ok) return status;
     return result == 1 ? exit_status::Ok : exit_status::Failed;
 }
 
 int Rename(OpenJob& open, const std::string& from, const std::string& to) {
-    if (open.container->GetNeditDoc(Wide(to)) != nullptr) {
+    if (open.container->HasName(Wide(to))) {
         std::fprintf(stderr, "sxnedit: the job has a document %s already\n", to.c_str());
         return exit_status::Failed;
     }
@@ -139,30 +123,77 @@ int Delete(OpenJob& open, const std::string& name) {
     return open.container->DeleteNeditDoc(Wide(name)) ? exit_status::Ok : exit_status::Failed;
 }
 
+/// The words of every doc command; each command binds the ones it takes.
+struct DocOptions {
+    std::string job;
+    std::string name;
+    std::string other;   // the neutral file of an import, the new name of a rename
+    std::string output;  // the file of an export, the report of a reduction
+    bool json = false;
+};
+
+/// A doc command that opens the job and then does `work` on it.
+CLI::App* AddDocCommand(CLI::App& doc, CommandRun& run, const std::shared_ptr<DocOptions>& options,
+                        const char* name, const char* description,
+                        std::function<int(OpenJob&, const DocOptions&)> work) {
+    CLI::App* command = doc.add_subcommand(name, description);
+    command->add_option("JOB", options->job, "the job file")->required();
+    command->callback([options, work, &run] {
+        run = [options, work] {
+            if (!RunFiles().Reads(options->job).Writes(options->output).Check()) {
+                return exit_status::Failed;
+            }
+            OpenJob open;
+            if (!Open(options->job, open)) return exit_status::Unreadable;
+            return work(open, *options);
+        };
+    });
+    return command;
+}
+
 }  // namespace
 
-int RunDoc(const std::vector<std::string>& args) {
-    if (args.size() < 2) {
-        std::fputs(kDocUsage, stderr);
-        return exit_status::Usage;
-    }
-    const std::string& command = args[0];
-    const std::vector<std::string> rest(args.begin() + 1, args.end());
-    const std::size_t count = rest.size();
-    const bool known = (command == "list" && count == 1) ||
-                       (command == "import" && (count == 2 || count == 4)) ||
-                       (command == "export" && count == 3) || (command == "reduce" && count >= 2) ||
-                       (command == "rename" && count == 3) || (command == "delete" && count == 2);
-    if (!known || (command == "import" && count == 4 && rest[2] != "--name")) {
-        std::fputs(kDocUsage, stderr);
-        return exit_status::Usage;
-    }
-    OpenJob open;
-    if (!Open(rest[0], open)) return exit_status::Unreadable;
-    if (command == "list") return List(open);
-    if (command == "import") return Import(open, rest[1], count == 4 ? rest[3] : std::string());
-    if (command == "export") return Export(open, rest[1], rest[2]);
-    if (command == "reduce") return Reduce(open, rest);
-    if (command == "rename") return Rename(open, rest[1], rest[2]);
-    return Delete(open, rest[1]);
+void AddDocCommands(CLI::App& app, CommandRun& run) {
+    auto options = std::make_shared<DocOptions>();
+    CLI::App* doc = app.add_subcommand("doc", "the raw-data documents stored in a job");
+    doc->require_subcommand(1);
+
+    AddDocCommand(*doc, run, options, "list", "the raw-data documents stored in a job",
+                  [](OpenJob& open, const DocOptions&) { return List(open); });
+
+    CLI::App* import = AddDocCommand(
+        *doc, run, options, "import", "store a neutral file in the job as a raw-data document",
+        [](OpenJob& open, const DocOptions& o) { return Import(open, o.other, o.name); });
+    import->add_option("FILE.neu", options->other, "the neutral file")->required();
+    import->add_option("--name", options->name, "the document's name (else Data1, Data2, ...)")
+        ->option_text("NAME");
+
+    CLI::App* exported = AddDocCommand(
+        *doc, run, options, "export", "write a document's records as a neutral file",
+        [](OpenJob& open, const DocOptions& o) { return Export(open, o.name, o.output); });
+    exported->add_option("NAME", options->name, "the document")->required();
+    exported->add_option("FILE.neu", options->output, "the neutral file to write")->required();
+
+    CLI::App* reduce = AddDocCommand(
+        *doc, run, options, "reduce",
+        "reduce a stored document; coordinates that the run took\n"
+        "from the job or the user are added to its records",
+        [](OpenJob& open, const DocOptions& o) { return Reduce(open, o.name, o.output, o.json); });
+    reduce->add_option("NAME", options->name, "the document")->required();
+    reduce->add_option("--report", options->output, "write the reduction report; - prints it")
+        ->option_text("OUT.txt|-");
+    reduce->add_flag("--json", options->json, "print the reduction's results as JSON");
+    reduce->parse_complete_callback(
+        [options] { CheckOutputOptions(options->output, options->json); });
+
+    CLI::App* rename = AddDocCommand(
+        *doc, run, options, "rename", "give a document another name",
+        [](OpenJob& open, const DocOptions& o) { return Rename(open, o.name, o.other); });
+    rename->add_option("OLD", options->name, "the document")->required();
+    rename->add_option("NEW", options->other, "its new name")->required();
+
+    CLI::App* remove =
+        AddDocCommand(*doc, run, options, "delete", "delete a document from the job",
+                      [](OpenJob& open, const DocOptions& o) { return Delete(open, o.name); });
+    remove->add_option("NAME", options->name, "the document")->required();
 }

@@ -2,7 +2,10 @@
 // port, as they arrive, until the data end, the link closes, nothing comes for the time-out
 // or Ctrl-C stops it. What arrived is kept in every case, and the raw data too.
 
+#include <CLI/CLI.hpp>
 #include <cstdio>
+#include <map>
+#include <memory>
 #include <optional>
 
 #include "Commands.h"
@@ -12,7 +15,6 @@
 #include "instruments/RawFiles.h"
 #include "instruments/UDeviceManager.h"
 #include "instruments/UPortSetting.h"
-#include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
 
 namespace {
@@ -29,74 +31,6 @@ struct DownloadOptions {
     double timeout = 10.0;  // seconds without a record before the link is given up
 };
 
-template <class Value>
-bool Pick(const std::string& word, std::initializer_list<std::pair<const char*, Value>> choices,
-          std::optional<Value>& value) {
-    const std::wstring wide = nedit::FromUtf8(word);
-    for (const auto& [name, choice] : choices) {
-        if (nedit::EqualsIgnoreCase(wide, nedit::FromUtf8(name))) {
-            value = choice;
-            return true;
-        }
-    }
-    return false;
-}
-
-bool Number(const std::string& word, std::optional<int>& value) {
-    if (word.empty() || word.find_first_not_of("0123456789") != std::string::npos) return false;
-    value = nedit::TextToInt(nedit::FromUtf8(word));
-    return true;
-}
-
-// Takes the download's own option at args[i]; false when it is none or its value is wrong.
-bool ParsePortOption(const std::vector<std::string>& args, std::size_t& i,
-                     DownloadOptions& options) {
-    using nedit::FlowControl;
-    using nedit::Parity;
-    using nedit::StopBits;
-    const std::string& option = args[i];
-    if (i + 1 >= args.size()) return false;
-    const std::string& value = args[++i];
-    if (option == "--port") return !(options.port = value).empty();
-    if (option == "--raw") return !(options.raw = value).empty();
-    if (option == "--baud") return Number(value, options.baud);
-    if (option == "--data-bits") return Number(value, options.dataBits);
-    if (option == "--timeout") {
-        options.timeout = nedit::TextToDouble(nedit::FromUtf8(value));
-        return options.timeout > 0.0;
-    }
-    if (option == "--stop-bits")
-        return Pick(value,
-                    {{"1", StopBits::One}, {"1.5", StopBits::OneAndHalf}, {"2", StopBits::Two}},
-                    options.stopBits);
-    if (option == "--parity")
-        return Pick(value,
-                    {{"none", Parity::None},
-                     {"odd", Parity::Odd},
-                     {"even", Parity::Even},
-                     {"mark", Parity::Mark},
-                     {"space", Parity::Space}},
-                    options.parity);
-    if (option == "--flow")
-        return Pick(value,
-                    {{"none", FlowControl::None},
-                     {"xon/xoff", FlowControl::XonXoff},
-                     {"xonxoff", FlowControl::XonXoff},
-                     {"hardware", FlowControl::Hardware}},
-                    options.flow);
-    return false;
-}
-
-bool ParseOptions(const std::vector<std::string>& args, DownloadOptions& options) {
-    const auto port = [&options](const std::vector<std::string>& words, std::size_t& i) {
-        return ParsePortOption(words, i, options);
-    };
-    if (!ParseTransferArguments(args, "download", options.transfer, port)) return false;
-    if (!options.port.empty()) return true;
-    std::fprintf(stderr, "sxnedit: download needs --port COM1|DEVICE (see sxnedit --help)\n");
-    return false;
-}
-
 // The port's stored settings with the options laid over them.
 nedit::SerialSettings PortSettings(const DownloadOptions& options) {
     nedit::SerialSettings settings = UPortSetting::LoadSettings(nedit::FromUtf8(options.port));
@@ -109,6 +43,9 @@ nedit::SerialSettings PortSettings(const DownloadOptions& options) {
 }
 
 int DownloadRawData(const DownloadOptions& options) {
+    if (!CheckTransferFiles(options.transfer, RunFiles().Reads(options.port).Writes(options.raw))) {
+        return exit_status::Failed;
+    }
     TransferTarget target;
     if (const int status = target.Open(options.transfer)) return status;
     UDeviceManager& manager = target.Manager();
@@ -153,8 +90,53 @@ int DownloadRawData(const DownloadOptions& options) {
 
 }  // namespace
 
-int RunDownload(const std::vector<std::string>& args) {
-    DownloadOptions options;
-    if (!ParseOptions(args, options)) return exit_status::Usage;
-    return DownloadRawData(options);
+void AddDownloadCommand(CLI::App& app, CommandRun& run) {
+    using nedit::FlowControl;
+    using nedit::Parity;
+    using nedit::StopBits;
+    auto options = std::make_shared<DownloadOptions>();
+    CLI::App* download =
+        app.add_subcommand("download",
+                           "receive records from an instrument on a serial port until\n"
+                           "its data end, the link closes, nothing comes for the\n"
+                           "time-out or Ctrl-C; what arrived is kept. Port values not\n"
+                           "given come from the port's stored settings");
+    AddTransferOptions(*download, options->transfer);
+    download->add_option("--port", options->port, "the port: COM1..COM8 or a device")
+        ->required()
+        ->option_text("COM1|DEVICE");
+    download->add_option("--baud", options->baud, "bits per second")
+        ->check(CLI::PositiveNumber)
+        ->option_text("N");
+    download->add_option("--data-bits", options->dataBits, "data bits")
+        ->check(CLI::Range(5, 8))
+        ->option_text("5..8");
+    const std::map<std::string, StopBits> stopBits = {
+        {"1", StopBits::One}, {"1.5", StopBits::OneAndHalf}, {"2", StopBits::Two}};
+    download->add_option("--stop-bits", options->stopBits, "stop bits")
+        ->transform(CLI::CheckedTransformer(stopBits))
+        ->option_text("1|1.5|2");
+    const std::map<std::string, Parity> parities = {{"none", Parity::None},
+                                                    {"odd", Parity::Odd},
+                                                    {"even", Parity::Even},
+                                                    {"mark", Parity::Mark},
+                                                    {"space", Parity::Space}};
+    download->add_option("--parity", options->parity, "parity")
+        ->transform(CLI::CheckedTransformer(parities, CLI::ignore_case))
+        ->option_text("none|odd|even|mark|space");
+    const std::map<std::string, FlowControl> flows = {{"none", FlowControl::None},
+                                                      {"xon/xoff", FlowControl::XonXoff},
+                                                      {"xonxoff", FlowControl::XonXoff},
+                                                      {"hardware", FlowControl::Hardware}};
+    download->add_option("--flow", options->flow, "flow control")
+        ->transform(CLI::CheckedTransformer(flows, CLI::ignore_case))
+        ->option_text("none|xon/xoff|hardware");
+    download->add_option("--raw", options->raw, "keep the raw data in this file")
+        ->option_text("OUT");
+    download
+        ->add_option("--timeout", options->timeout,
+                     "seconds without data before the link is given up (10)")
+        ->check(CLI::PositiveNumber)
+        ->option_text("SECONDS");
+    download->callback([options, &run] { run = [options] { return DownloadRawData(*options); }; });
 }

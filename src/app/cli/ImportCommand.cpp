@@ -1,7 +1,9 @@
 // sxnedit import RAWFILE --instrument NAME: a raw file through its driver into neutral
 // records, on standard output, in a file or in a new document of a job.
 
+#include <CLI/CLI.hpp>
 #include <cstdio>
+#include <memory>
 
 #include "Commands.h"
 #include "Transfer.h"
@@ -17,19 +19,10 @@ struct ImportOptions {
     TransferOptions transfer;
 };
 
-bool ParseOptions(const std::vector<std::string>& args, ImportOptions& options) {
-    const auto file = [&options](const std::vector<std::string>& words, std::size_t& i) {
-        if (words[i].empty() || words[i][0] == '-' || !options.file.empty()) return false;
-        options.file = words[i];
-        return true;
-    };
-    if (!ParseTransferArguments(args, "import", options.transfer, file)) return false;
-    if (!options.file.empty()) return true;
-    std::fprintf(stderr, "sxnedit: import needs a raw file (see sxnedit --help)\n");
-    return false;
-}
-
 int ImportRawFile(const ImportOptions& options) {
+    if (!CheckTransferFiles(options.transfer, RunFiles().Reads(options.file))) {
+        return exit_status::Failed;
+    }
     TransferTarget target;
     if (const int status = target.Open(options.transfer)) return status;
     TerminalProgress progress(target.List(), target.Manager());
@@ -55,8 +48,16 @@ int ImportRawFile(const ImportOptions& options) {
 
 }  // namespace
 
-int RunImport(const std::vector<std::string>& args) {
-    ImportOptions options;
-    if (!ParseOptions(args, options)) return exit_status::Usage;
-    return ImportRawFile(options);
+void AddImportCommand(CLI::App& app, CommandRun& run) {
+    auto options = std::make_shared<ImportOptions>();
+    CLI::App* import =
+        app.add_subcommand("import",
+                           "translate an instrument's raw file into neutral records,\n"
+                           "on standard output, into OUT.neu or into a new document\n"
+                           "of JOB; the units are the job's unless given");
+    import->add_option("RAWFILE", options->file, "the instrument's raw file")->required();
+    AddTransferOptions(*import, options->transfer);
+    import->callback([options, &run] { run = [options] { return ImportRawFile(*options);
+};
+});
 }

@@ -1,9 +1,13 @@
 // sxnedit instruments [--json]: the instrument drivers found, and those refused.
 
+#include <CLI/CLI.hpp>
+#include <algorithm>
 #include <cstdio>
+#include <memory>
+#include <vector>
 
 #include "Commands.h"
-#include "Json.h"
+#include "JsonLayout.h"
 #include "instruments/DriverCatalogue.h"
 #include "platform/text/WideText.h"
 
@@ -14,41 +18,38 @@ struct InstrumentsOptions {
 };
 
 // The extensions as a JSON list: "gsi,gs8" gives ["gsi", "gs8"].
-std::string ExtensionList(const std::wstring& extensions) {
-    std::string list;
+json::Value ExtensionList(const std::wstring& extensions) {
+    json::Value list = json::Value::array();
     for (std::size_t start = 0; start < extensions.size();) {
         const std::size_t comma = std::min(extensions.find(L',', start), extensions.size());
-        if (comma > start)
-            list +=
-                (list.empty() ? "" : ", ") + json::Quote(extensions.substr(start, comma - start));
+        if (comma > start) list.push_back(json::Text(extensions.substr(start, comma - start)));
         start = comma + 1;
     }
-    return "[" + list + "]";
+    return list;
+}
+
+void PrintJson(const nedit::DriverCatalogue& drivers) {
+    std::vector<json::Value> found;
+    for (const nedit::DriverInfo& driver : drivers.Drivers()) {
+        found.push_back({{"name", json::Text(driver.name)},
+                         {"description", json::Text(driver.description)},
+                         {"extensions", ExtensionList(driver.extensions)},
+                         {"file", driver.path}});
+    }
+    std::vector<json::Value> refused;
+    for (const nedit::RefusedDriver& driver : drivers.Refused()) {
+        refused.push_back({{"file", driver.file}, {"reason", driver.reason}});
+    }
+    std::printf("%s\n", json::Members({{"directory", json::Inline(drivers.Directory())},
+                                       {"drivers", json::Rows(found, 2)},
+                                       {"refused", json::Rows(refused, 2)}})
+                            .c_str());
 }
 
 int ListInstruments(const InstrumentsOptions& options) {
     const nedit::DriverCatalogue drivers(nedit::DriverCatalogue::DefaultDirectory());
     if (options.json) {
-        std::printf("{\"directory\": %s,\n \"drivers\": [",
-                    json::Quote(nedit::FromUtf8(drivers.Directory())).c_str());
-        const char* separator = "";
-        for (const nedit::DriverInfo& driver : drivers.Drivers()) {
-            std::printf(
-                "%s\n  {\"name\": %s, \"description\": %s, \"extensions\": %s, \"file\": %s}",
-                separator, json::Quote(driver.name).c_str(),
-                json::Quote(driver.description).c_str(), ExtensionList(driver.extensions).c_str(),
-                json::Quote(nedit::FromUtf8(driver.path)).c_str());
-            separator = ",";
-        }
-        std::printf("],\n \"refused\": [");
-        separator = "";
-        for (const nedit::RefusedDriver& refused : drivers.Refused()) {
-            std::printf("%s\n  {\"file\": %s, \"reason\": %s}", separator,
-                        json::Quote(nedit::FromUtf8(refused.file)).c_str(),
-                        json::Quote(nedit::FromUtf8(refused.reason)).c_str());
-            separator = ",";
-        }
-        std::printf("]}\n");
+        PrintJson(drivers);
     } else {
         for (const nedit::DriverInfo& driver : drivers.Drivers()) {
             std::printf("%-12s %s (%s)\n", nedit::ToUtf8(driver.name).c_str(),
@@ -67,14 +68,13 @@ int ListInstruments(const InstrumentsOptions& options) {
 
 }  // namespace
 
-int RunInstruments(const std::vector<std::string>& args) {
-    InstrumentsOptions options;
-    for (const std::string& arg : args) {
-        if (arg != "--json") {
-            std::fprintf(stderr, "sxnedit: instruments takes only --json (see sxnedit --help)\n");
-            return exit_status::Usage;
-        }
-        options.json = true;
-    }
-    return ListInstruments(options);
+void AddInstrumentsCommand(CLI::App& app, CommandRun& run) {
+    auto options = std::make_shared<InstrumentsOptions>();
+    CLI::App* instruments =
+        app.add_subcommand("instruments",
+                           "the instrument drivers found, with their descriptions\n"
+                           "and raw file extensions; drivers that were refused, and why");
+    instruments->add_flag("--json", options->json, "print them as JSON");
+    instruments->callback(
+        [options, &run] { run = [options] { return ListInstruments(*options); }; });
 }

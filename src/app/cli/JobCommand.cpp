@@ -1,12 +1,16 @@
 // sxnedit job ...: make a job file, list, import and export its points, and describe it.
 
+#include <CLI/CLI.hpp>
 #include <cstdio>
+#include <functional>
 #include <map>
+#include <memory>
 #include <string>
 #include <vector>
 
 #include "Commands.h"
 #include "PointOutput.h"
+#include "RunFiles.h"
 #include "platform/io/LineReader.h"
 #include "platform/job/Csv.h"
 #include "platform/job/UDBPoint.h"
@@ -18,10 +22,6 @@
 #include "platform/text/WideText.h"
 
 namespace {
-
-const char* const kJobUsage =
-    "sxnedit: job takes one of: new JOB, points JOB [--json], import-points JOB FILE.csv,\n"
-    "export-points JOB FILE.csv, info JOB (see sxnedit --help)\n";
 
 /// One point of a CSV file.
 struct CsvPoint {
@@ -190,6 +190,7 @@ int Import(const std::string& path, const std::string& file) {
 }
 
 int Export(const std::string& path, const std::string& file) {
+    if (!RunFiles().Reads(path).Writes(file).Check()) return exit_status::Failed;
     nedit::JobOpenOptions options;
     options.access = nedit::JobAccess::ReadOnly;
     auto job = USurveyDoc::OpenJob(path, options);
@@ -231,15 +232,39 @@ int Info(const std::string& path) {
 
 }  // namespace
 
-int RunJob(const std::vector<std::string>& args) {
-    const std::string command = args.empty() ? "" : args[0];
-    const std::size_t count = args.size();
-    if (command == "new" && count == 2) return New(args[1]);
-    if (command == "points" && count == 2) return Points(args[1], false);
-    if (command == "points" && count == 3 && args[2] == "--json") return Points(args[1], true);
-    if (command == "import-points" && count == 3) return Import(args[1], args[2]);
-    if (command == "export-points" && count == 3) return Export(args[1], args[2]);
-    if (command == "info" && count == 2) return Info(args[1]);
-    std::fputs(kJobUsage, stderr);
-    return exit_status::Usage;
+void AddJobCommands(CLI::App& app, CommandRun& run) {
+    struct JobOptions {
+        std::string job;
+        std::string file;
+        bool json = false;
+    };
+    auto options = std::make_shared<JobOptions>();
+    CLI::App* job = app.add_subcommand("job", "job files and their points");
+    job->require_subcommand(1);
+    // Every job command names the job first; `work` is its work on the words given.
+    auto add = [&](const char* name, const char* description,
+                   std::function<int(const JobOptions&)> work) {
+        CLI::App* command = job->add_subcommand(name, description);
+        command->add_option("JOB", options->job, "the job file")->required();
+        command->callback(
+            [options, work, &run] { run = [options, work] { return work(*options); }; });
+        return command;
+    };
+    add("new", "make a new job file, with the default survey codes",
+        [](const JobOptions& o) { return New(o.job); });
+    add("points", "list the job's points", [](const JobOptions& o) {
+        return Points(o.job, o.json);
+    })->add_flag("--json", options->json, "objects with id, e, n, h (null: no height) and code");
+    add("import-points",
+        "add or update points from name,east,north,height,code\n"
+        "rows (empty height: none; a later row of a name wins)",
+        [](const JobOptions& o) { return Import(o.job, o.file); })
+        ->add_option("FILE.csv", options->file, "the points")
+        ->required();
+    add("export-points", "write the job's points as such rows",
+        [](const JobOptions& o) { return Export(o.job, o.file); })
+        ->add_option("FILE.csv", options->file, "the file to write")
+        ->required();
+    add("info", "the job's settings and what it holds",
+        [](const JobOptions& o) { return Info(o.job); });
 }

@@ -2,7 +2,7 @@
 
 #include <cstdio>
 
-#include "Json.h"
+#include "JsonLayout.h"
 #include "platform/io/ReplaceFile.h"
 #include "platform/job/Csv.h"
 #include "platform/text/Format.h"
@@ -24,18 +24,16 @@ std::string PointsTable(const std::vector<PointRow>& points, int decimals) {
 }
 
 std::string PointsJson(const std::vector<PointRow>& points, int indent) {
-    if (points.empty()) return "[]";
-    const std::string margin(static_cast<std::size_t>(indent), ' ');
-    std::string out = "[";
-    const char* separator = "\n";
+    std::vector<json::Value> rows;
+    rows.reserve(points.size());
     for (const PointRow& point : points) {
-        out += separator + margin + "  {\"id\": " + json::Quote(point.name) +
-               ", \"e\": " + json::Number(point.east) + ", \"n\": " + json::Number(point.north) +
-               ", \"h\": " + (point.hasHeight ? json::Number(point.height) : "null") +
-               ", \"code\": " + json::Quote(point.code) + "}";
-        separator = ",\n";
+        rows.push_back({{"id", json::Text(point.name)},
+                        {"e", point.east},
+                        {"n", point.north},
+                        {"h", point.hasHeight ? json::Value(point.height) : json::Value()},
+                        {"code", json::Text(point.code)}});
     }
-    return out + "\n" + margin + "]";
+    return json::Rows(rows, indent);
 }
 
 std::string PointsCsv(const std::vector<PointRow>& points) {

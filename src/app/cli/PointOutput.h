@@ -16,8 +16,8 @@ struct PointRow {
 
 /// Columns Name, East, North, Height, Code with `decimals` places; "-" for no height.
 std::string PointsTable(const std::vector<PointRow>& points, int decimals);
-/// A JSON array of objects id, e, n, h (null for no height) and code, one per line,
-/// indented by `indent` blanks.
+/// A JSON array of objects id, e, n, h (null for no height) and code, one per line, the
+/// array indented by `indent` blanks.
 std::string PointsJson(const std::vector<PointRow>& points, int indent);
 /// A header row and one row per point; numbers written so that they read back exactly.
 std::string PointsCsv(const std::vector<PointRow>& points);

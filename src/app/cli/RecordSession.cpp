@@ -17,11 +17,9 @@ bool RecordSession::Start(USurveyDoc* job) {
     return false;
 }
 
-UNeditDatabase& RecordSession::StartEngine(bool withReport) {
+UNeditDatabase& RecordSession::StartEngine() {
     engine = std::make_unique<UNeditDatabase>(doc.get(), list.get(), doc->GetSurveyDoc(), &host);
-    if (withReport) {
-        report = std::make_unique<UNeditReport>(doc.get(), L"Raw Data Reduction Report");
-        engine->SetReportPtr(report.get());
-    }
+    report = std::make_unique<UNeditReport>(doc.get(), L"Raw Data Reduction Report");
+    engine->SetReportPtr(report.get());
     return *engine;
 }

@@ -18,8 +18,10 @@ struct RecordSession {
     /// be null); false, with a message on standard error, when the record definition cannot
     /// be loaded.
     bool Start(USurveyDoc* job = nullptr);
-    /// The engine, with the report when `withReport` is set.
-    UNeditDatabase& StartEngine(bool withReport);
+    /// The engine, always with its report, as the document builds it: the report takes part
+    /// in the reduction (a back station of known position orients a station only when there
+    /// is one), so a run without it would give other points.
+    UNeditDatabase& StartEngine();
 
     ConsoleDialogHost host;
     std::unique_ptr<UNeditDoc> doc;

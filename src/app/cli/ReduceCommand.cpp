@@ -1,15 +1,17 @@
 // sxnedit reduce FILE.neu: a full reduction of a neutral file, its points as a table, as
 // JSON, or as a CSV file.
 
+#include <CLI/CLI.hpp>
 #include <algorithm>
 #include <cstdio>
-#include <initializer_list>
+#include <memory>
 #include <string>
+#include <vector>
 
 #include "Commands.h"
-#include "PointOutput.h"
 #include "RecordSession.h"
 #include "ReductionOutput.h"
+#include "RunFiles.h"
 #include "platform/job/JobError.h"
 #include "platform/job/USurveyDoc.h"
 #include "platform/text/WideText.h"
@@ -17,84 +19,50 @@
 
 namespace {
 
+// The output units of the report, in the order of their indexes.
+const std::vector<std::string> kAngleUnits = {"dms", "deg", "gon"};
+const std::vector<std::string> kLengthUnits = {"m", "ft", "usft"};
+
 struct ReduceOptions {
     std::string file;
     std::string job;
     std::string points_csv;
     std::string report;  // a file, or "-" for standard output
-    int angles = -1;     // report output units; -1 keeps the job's
-    int lengths = -1;
+    std::string angles;  // empty keeps the job's output units
+    std::string lengths;
     std::string columns;
-    bool columns_given = false;
+    bool columns_given = false;  // else the columns of NEDIT.INI
     bool json = false;
     bool interactive = false;
 };
 
-// The place of `word` in `choices`, or -1.
-int Choice(const std::string& word, std::initializer_list<const char*> choices) {
-    int index = 0;
-    for (const char* choice : choices) {
-        if (word == choice) return index;
-        ++index;
-    }
-    return -1;
+int IndexOf(const std::vector<std::string>& choices, const std::string& word) {
+    return static_cast<int>(std::find(choices.begin(), choices.end(), word) - choices.begin());
 }
 
-// Column tokens as --columns takes them, separated by commas.
-bool ValidColumns(const std::string& columns) {
+// Column tokens as --columns takes them, separated by commas: empty when they all are known.
+std::string CheckColumns(const std::string& columns) {
     std::size_t start = 0;
     while (start <= columns.size()) {
         const std::size_t comma = std::min(columns.find(',', start), columns.size());
-        const std::wstring token = nedit::FromUtf8(columns.substr(start, comma - start));
-        if (!token.empty() && !IsColumnToken(token)) return false;
+        const std::string token = columns.substr(start, comma - start);
+        if (!token.empty() && !IsColumnToken(nedit::FromUtf8(token))) {
+            return "'" + token + "' is no column (ID,LN,HA,VA,SD,HD,VD,HT,CO,EC,NC,HC)";
+        }
         start = comma + 1;
     }
-    return true;
+    return {};
 }
 
-bool ParseOptions(const std::vector<std::string>& args, ReduceOptions& options) {
-    for (std::size_t i = 0; i < args.size(); ++i) {
-        const std::string& arg = args[i];
-        const bool has_value = i + 1 < args.size();
-        if (arg == "--json") {
-            options.json = true;
-        } else if (arg == "--interactive") {
-            options.interactive = true;
-        } else if (arg == "--job" && has_value) {
-            options.job = args[++i];
-        } else if (arg == "--points" && has_value) {
-            options.points_csv = args[++i];
-        } else if (arg == "--report" && has_value) {
-            options.report = args[++i];
-        } else if (arg == "--angles" && has_value &&
-                   (options.angles = Choice(args[i + 1], {"dms", "deg", "gon"})) >= 0) {
-            ++i;
-        } else if (arg == "--lengths" && has_value &&
-                   (options.lengths = Choice(args[i + 1], {"m", "ft", "usft"})) >= 0) {
-            ++i;
-        } else if (arg == "--columns" && has_value && ValidColumns(args[i + 1])) {
-            options.columns = args[++i];
-            options.columns_given = true;
-        } else if (!arg.empty() && arg[0] != '-' && options.file.empty()) {
-            options.file = arg;
-        } else {
-            std::fprintf(stderr, "sxnedit: reduce: unexpected '%s' (see sxnedit --help)\n",
-                         arg.c_str());
-            return false;
-        }
+int Reduce(const ReduceOptions& options) {
+    if (!RunFiles()
+             .Reads(options.file)
+             .Reads(options.job)
+             .Writes(options.report)
+             .Writes(options.points_csv)
+             .Check()) {
+        return exit_status::Failed;
     }
-    if (options.file.empty()) {
-        std::fprintf(stderr, "sxnedit: reduce needs a neutral file (see sxnedit --help)\n");
-        return false;
-    }
-    return CheckOutputOptions(options.report, options.json);
-}
-
-}  // namespace
-
-int RunReduce(const std::vector<std::string>& args) {
-    ReduceOptions options;
-    if (!ParseOptions(args, options)) return exit_status::Usage;
     std::unique_ptr<USurveyDoc> job;
     if (!options.job.empty()) {
         try {
@@ -109,11 +77,11 @@ int RunReduce(const std::vector<std::string>& args) {
     session.host.SetEcho(!options.json);
     if (!session.Start(job.get())) return exit_status::Failed;
     OutParamStruct& parameters = session.doc->GetOutputParameters();
-    if (options.angles >= 0) parameters.AngularUnit = options.angles;
-    if (options.lengths >= 0) parameters.LinearUnit = options.lengths;
+    if (!options.angles.empty()) parameters.AngularUnit = IndexOf(kAngleUnits, options.angles);
+    if (!options.lengths.empty()) parameters.LinearUnit = IndexOf(kLengthUnits, options.lengths);
     if (options.columns_given) SetFlagsFromOrder(parameters, nedit::FromUtf8(options.columns));
 
-    UNeditDatabase& engine = session.StartEngine(!options.report.empty());
+    UNeditDatabase& engine = session.StartEngine();
     if (!engine.LoadNeFile(nedit::FromUtf8(options.file))) {
         if (options.json) {
             for (const std::wstring& message : session.host.Messages()) {
@@ -123,13 +91,55 @@ int RunReduce(const std::vector<std::string>& args) {
         return exit_status::Unreadable;
     }
     const int result = engine.Process();
-    if (!WriteReductionOutput(engine, session.report.get(), options.report, options.json,
-                              session.host.Messages(),
-                              session.doc->GetSettings().GetLengthDecimals())) {
-        return exit_status::Failed;
-    }
-    if (!options.points_csv.empty() && !WritePointsCsv(options.points_csv, ReducedPoints(engine))) {
-        return exit_status::Failed;
-    }
+    ReductionOutputs outputs;
+    outputs.report = options.report;
+    outputs.points = options.points_csv;
+    outputs.json = options.json;
+    outputs.decimals = session.doc->GetSettings().GetLengthDecimals();
+    const int status = WriteReductionOutput(engine, session.report.get(), outputs, session.host);
+    if (status != exit_status::Ok) return status;
     return result == 1 ? exit_status::Ok : exit_status::Failed;
+}
+
+}  // namespace
+
+void AddReduceCommand(CLI::App& app, CommandRun& run) {
+    auto options = std::make_shared<ReduceOptions>();
+    CLI::App* reduce =
+        app.add_subcommand("reduce",
+                           "reduce the observations to East, North, Height and print\n"
+                           "the points; questions are answered as \"Apply to All\"\n"
+                           "would (job, else field records, else entered values)");
+    reduce->add_option("FILE.neu", options->file, "the neutral file")->required();
+    reduce->add_option("--job", options->job, "take known points from this job")
+        ->option_text("JOB");
+    reduce->add_flag("--json", options->json,
+                     "print points, lines, arcs, circles, the error code and\n"
+                     "the messages as JSON");
+    reduce
+        ->add_option("--points", options->points_csv,
+                     "write name,east,north,height,code rows that\n"
+                     "'job import-points' reads")
+        ->option_text("OUT.csv");
+    reduce->add_flag("--interactive", options->interactive, "ask the questions on the terminal");
+    reduce->add_option("--report", options->report, "write the reduction report; - prints it")
+        ->option_text("OUT.txt|-");
+    reduce->add_option("--angles", options->angles, "the report's angle unit for this run")
+        ->check(CLI::IsMember(kAngleUnits))
+        ->option_text("dms|deg|gon");
+    reduce->add_option("--lengths", options->lengths, "the report's length unit for this run")
+        ->check(CLI::IsMember(kLengthUnits))
+        ->option_text("m|ft|usft");
+    CLI::Option* columns =
+        reduce
+            ->add_option("--columns", options->columns,
+                         "the columns of the report's observation tables,\n"
+                         "of ID,LN,HA,VA,SD,HD,VD,HT,CO,EC,NC,HC")
+            ->check(CLI::Validator([](std::string& text) { return CheckColumns(text); }, "COLUMNS"))
+            ->option_text("COLUMNS");
+    reduce->callback([options, columns, &run] {
+        options->columns_given = columns->count() > 0;
+        CheckOutputOptions(options->report, options->json);
+        run = [options] { return Reduce(*options); };
+    });
 }

@@ -1,25 +1,43 @@
 #pragma once
-// What a reduction gives, as the command line prints it.
+// What a reduction gives, as the command line prints and writes it.
+//
+// Decision: the arithmetic stands as it is, and the report prints what it gives; but a point
+// whose coordinates came out as no finite number (an overflow, say of a scale of 1e308) is
+// named in the run's messages and left out of the table, the JSON and the points file, so
+// that no program reads "inf" as a coordinate or null as "no height", and the run fails.
+// A circle that came out so is left out alike.
 
 #include <string>
 #include <vector>
 
 #include "PointOutput.h"
 
+class ConsoleDialogHost;
 class UNeditDatabase;
 class UNeditReport;
 
-/// The reduced points of a run, in the order of the point store.
+/// The reduced points of a run whose coordinates are finite numbers, in the order of the
+/// point store.
 std::vector<PointRow> ReducedPoints(const UNeditDatabase& engine);
-/// One JSON object: points, lines, arcs, circles, the engine's error code and the messages.
-void PrintJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages);
 
-/// False, with a message, when the JSON and the report would both go to standard output.
-bool CheckOutputOptions(const std::string& reportPath, bool json);
+/// One JSON object: points, lines, arcs, circles (those with finite numbers), the engine's
+/// error code and the messages.
+std::string ReductionJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages);
 
-/// Writes what a reduction gives: the report to `reportPath` ("-" for standard output, empty
-/// for none), then the JSON, or the table of points unless the report took standard output.
-/// False, with a message, when the report file cannot be written.
-bool WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report,
-                          const std::string& reportPath, bool json,
-                          const std::vector<std::wstring>& messages, int decimals);
+/// Throws CLI::ValidationError when the JSON and the report would both go to standard output.
+void CheckOutputOptions(const std::string& reportPath, bool json);
+
+/// Where a reduction's results go.
+struct ReductionOutputs {
+    std::string report;  // a file, "-" for standard output, empty for none
+    std::string points;  // the points file, empty for none
+    bool json = false;   // the JSON on standard output, else the table of points
+    int decimals = 3;    // of the table
+};
+
+/// Tells through `host` of points and circles that are no finite numbers, then writes the
+/// report, the JSON or the table of points (unless the report took standard output) and the
+/// points file. Gives the exit status: Failed, after a message, when a file cannot be
+/// written or something was left out; else Ok.
+int WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report,
+                         const ReductionOutputs& outputs, ConsoleDialogHost& host);

@@ -1,21 +1,22 @@
 // sxnedit rows FILE.neu: the rows of a neutral file as the record list holds them.
 
+#include <CLI/CLI.hpp>
 #include <cstdio>
+#include <memory>
+#include <string>
 
 #include "Commands.h"
 #include "RecordSession.h"
 #include "platform/text/WideText.h"
 
-int RunRows(const std::vector<std::string>& args) {
-    if (args.size() != 1) {
-        std::fprintf(stderr, "sxnedit: rows takes one neutral file (see sxnedit --help)\n");
-        return exit_status::Usage;
-    }
+namespace {
+
+int Rows(const std::string& file) {
     RecordSession session;
     if (!session.Start()) return exit_status::Failed;
-    if (!session.StartEngine(false).LoadNeFile(nedit::FromUtf8(args[0]))) {
+    if (!session.StartEngine().LoadNeFile(nedit::FromUtf8(file))) {
         if (session.host.Messages().empty()) {
-            std::fprintf(stderr, "sxnedit: %s holds no records\n", args[0].c_str());
+            std::fprintf(stderr, "sxnedit: %s holds no records\n", file.c_str());
         }
         return exit_status::Unreadable;
     }
@@ -30,4 +31,16 @@ int RunRows(const std::vector<std::string>& args) {
     }
     std::fwrite(out.data(), 1, out.size(), stdout);
     return std::fflush(stdout) == 0 ? exit_status::Ok : exit_status::Failed;
+}
+
+}  // namespace
+
+void AddRowsCommand(CLI::App& app, CommandRun& run) {
+    auto file = std::make_shared<std::string>();
+    CLI::App* rows = app.add_subcommand(
+        "rows",
+        "print the records of a neutral file, one per line, as\n"
+        "the record list holds them (upper case, laid out,\nunknown keys as comments)");
+    rows->add_option("FILE.neu", *file, "the neutral file")->required();
+    rows->callback([file, &run] { run = [file] { return Rows(*file); }; });
 }

@@ -2,9 +2,10 @@
 
 #include <unistd.h>
 
+#include <CLI/CLI.hpp>
 #include <chrono>
 #include <cstdio>
-#include <initializer_list>
+#include <map>
 
 #include "Commands.h"
 #include "document/UListCtrl.h"
@@ -25,65 +26,38 @@ void OnInterrupt(int) {
     g_interrupted = 1;
 }
 
-// The place of `word` among `choices`, or -1.
-int IndexOf(const std::string& word, std::initializer_list<const char*> choices) {
-    int index = 0;
-    for (const char* choice : choices) {
-        if (word == choice) return index;
-        ++index;
-    }
-    return -1;
-}
-
 void Error(const std::string& text) {
     std::fprintf(stderr, "sxnedit: %s\n", text.c_str());
 }
 
-// Takes the option at args[i] (and its value) when it is one of TransferOptions: 1 when
-// taken, 0 when it is none of them, -1 when its value is missing or wrong.
-int ParseTransferOption(const std::vector<std::string>& args, std::size_t& i,
-                        TransferOptions& options) {
-    const std::string& option = args[i];
-    std::string* text = option == "--instrument" ? &options.instrument
-                        : option == "-o"         ? &options.output
-                        : option == "--job"      ? &options.job
-                        : option == "--name"     ? &options.name
-                                                 : nullptr;
-    int* choice = option == "--angles"    ? &options.angles
-                  : option == "--lengths" ? &options.lengths
-                                          : nullptr;
-    if (text == nullptr && choice == nullptr) return 0;
-    if (i + 1 >= args.size()) return -1;
-    const std::string& value = args[++i];
-    if (text != nullptr) {
-        *text = value;
-        return 1;
-    }
-    *choice = choice == &options.angles ? IndexOf(value, {"dms", "deg", "gon"})
-                                        : IndexOf(value, {"m", "ft", "usft"});
-    return *choice >= 0 ? 1 : -1;
-}
-
 }  // namespace
 
-bool ParseTransferArguments(const std::vector<std::string>& args, const char* command,
-                            TransferOptions& options, const OwnArgument& own) {
-    for (std::size_t i = 0; i < args.size(); ++i) {
-        const std::size_t at = i;
-        const int taken = ParseTransferOption(args, i, options);
-        if (taken > 0 || (taken == 0 && own(args, i))) continue;
-        std::fprintf(stderr, "sxnedit: %s: unexpected or incomplete '%s' (see sxnedit --help)\n",
-                     command, args[at].c_str());
-        return false;
-    }
-    const char* problem =
-        options.instrument.empty()                        ? "needs --instrument NAME"
-        : !options.output.empty() && !options.job.empty() ? "takes -o or --job, not both"
-        : !options.name.empty() && options.job.empty()    ? "takes --name only with --job"
-                                                          : nullptr;
-    if (problem == nullptr) return true;
-    std::fprintf(stderr, "sxnedit: %s %s (see sxnedit --help)\n", command, problem);
-    return false;
+void AddTransferOptions(CLI::App& command, TransferOptions& options) {
+    command.add_option("--instrument", options.instrument, "the instrument's driver")
+        ->required()
+        ->option_text("NAME");
+    CLI::Option* output =
+        command.add_option("-o", options.output, "write the records into this neutral file")
+            ->option_text("OUT.neu");
+    CLI::Option* job =
+        command.add_option("--job", options.job, "store the records as a new document of JOB")
+            ->option_text("JOB")
+            ->excludes(output);
+    command.add_option("--name", options.name, "the new document's name (else Data1, Data2, ...)")
+        ->option_text("DOC")
+        ->needs(job);
+    const std::map<std::string, int> angles = {{"dms", 0}, {"deg", 1}, {"gon", 2}};
+    const std::map<std::string, int> lengths = {{"m", 0}, {"ft", 1}, {"usft", 2}};
+    command.add_option("--angles", options.angles, "the records' angle unit (else the job's)")
+        ->transform(CLI::CheckedTransformer(angles))
+        ->option_text("dms|deg|gon");
+    command.add_option("--lengths", options.lengths, "the records' length unit (else the job's)")
+        ->transform(CLI::CheckedTransformer(lengths))
+        ->option_text("m|ft|usft");
+}
+
+bool CheckTransferFiles(const TransferOptions& options, RunFiles files) {
+    return files.Reads(options.job).Writes(options.output).Check();
 }
 
 TransferTarget::TransferTarget() = default;

@@ -7,10 +7,14 @@
 #include <functional>
 #include <memory>
 #include <string>
-#include <vector>
 
 #include "ConsoleDialogHost.h"
+#include "RunFiles.h"
 #include "platform/messages/ProgressSink.h"
+
+namespace CLI {
+class App;
+}
 
 class UDeviceManager;
 class UListCtrl;
@@ -28,15 +32,13 @@ struct TransferOptions {
     int lengths = -1;    // --lengths: 0 m, 1 ft, 2 usft; -1 the job's
 };
 
-/// Takes a command's own argument at args[i], moving i past a value it takes; false when the
-/// argument is not the command's or its value is wrong.
-using OwnArgument = std::function<bool(const std::vector<std::string>& args, std::size_t& i)>;
+/// Adds the options of TransferOptions to `command`: --instrument (required), -o or --job
+/// (not both), --name (only with --job), --angles and --lengths.
+void AddTransferOptions(CLI::App& command, TransferOptions& options);
 
-/// Reads the arguments of `command`: the options of TransferOptions, and the command's own
-/// through `own`. Then checks them: an instrument, -o or --job but not both, --name only with
-/// --job. False, with the reason on standard error.
-bool ParseTransferArguments(const std::vector<std::string>& args, const char* command,
-                            TransferOptions& options, const OwnArgument& own);
+/// The files of the transfer: the job is read, -o is written. False, with the reason on
+/// standard error, when an output may not be written.
+bool CheckTransferFiles(const TransferOptions& options, RunFiles files);
 
 /// The document that receives the records, with its list and the console host.
 class TransferTarget {

@@ -1,14 +1,29 @@
 #pragma once
-// Writing a whole file safely: the new text goes to a file beside the target, which is then
-// renamed over it, so a reader sees the old file or the new one, never half of either, and a
-// failed write leaves the old file as it was.
+// Writing a whole file safely. What is done depends on what the target is:
+// - a plain file (or none yet): the new text goes to a file beside it, which is then renamed
+//   over it, so a reader sees the old file or the new one, never half of either, and a failed
+//   write leaves the old file as it was. Its permissions, and its owner where that can be
+//   kept, stay.
+// - a device, a named pipe or a socket: written in place (a socket through a connection), as
+//   a shell's redirection would. Renaming a file over it would put a plain file in its place
+//   and the reader at the other end would get nothing. Opening a pipe waits for its reader.
+// - a symbolic link: followed; the file it leads to is written as above and the link stays.
+// Refused: a file without any write permission bit (even for root, who could write it: the
+// user marked it read-only on purpose), a folder, and a file in a folder that does not exist.
+//
+// A file with other hard links is replaced under this name only; the other names keep the
+// old text.
 
 #include <string>
 
 namespace nedit {
 
-/// Replaces the file at `target` (UTF-8 path) with `bytes`, keeping the permissions of the
-/// file it replaces. False, with the old file untouched, when it cannot be written.
+/// Writes `bytes` to `target` (a UTF-8 path) as said above. False when it cannot be written:
+/// the target is then as it was.
 bool ReplaceFile(const std::string& target, const std::string& bytes);
+
+/// Why ReplaceFile would refuse `target` ("it is read-only", "it is a folder", "the folder
+/// /x does not exist", "its folder /x cannot be written"), or empty when it can be written.
+std::string WhyNotWritable(const std::string& target);
 
 }  // namespace nedit

@@ -109,6 +109,28 @@ JobDatabase JobDatabase::Create(const std::string& path,
 }
 
 JobDatabase JobDatabase::Open(const std::string& path, const JobOpenOptions& options) {
+    try {
+        return OpenConnection(path, options);
+    } catch (const JobError& error) {
+        if (error.SqliteCode() != SQLITE_READONLY_ROLLBACK) throw;
+        struct stat info {};
+        if (stat(path.c_str(), &info) != 0 || IsReadOnlyFile(path, info) ||
+            access(FolderOf(path).c_str(), W_OK) != 0) {
+            throw JobError("The job " + path +
+                               " was left in the middle of a change by a program that stopped. "
+                               "It needs recovery, which a program that may write the job does "
+                               "when it opens it: make the file writable and open it again.",
+                           error.SqliteCode());
+        }
+    }
+    // A connection that may write puts the old pages back from the journal as it opens.
+    JobOpenOptions writing = options;
+    writing.access = JobAccess::ReadWrite;
+    OpenConnection(path, writing);
+    return OpenConnection(path, options);
+}
+
+JobDatabase JobDatabase::OpenConnection(const std::string& path, const JobOpenOptions& options) {
     if (path.empty()) throw JobError("No job file was named.");
     struct stat info {};
     if (stat(path.c_str(), &info) != 0) {

@@ -7,7 +7,9 @@
 // - Rollback journal (not WAL), synchronous FULL. A job is one file that surveyors copy,
 //   mail and keep on network shares; after every commit the file alone is complete, and no
 //   -wal/-shm files must travel with it. A transaction that was under way when the process
-//   died is rolled back by the next open, from the journal.
+//   died is rolled back by the next open, from the journal. Only a connection that may write
+//   can do that, so a job opened for reading is first opened for writing when it needs it;
+//   where the file cannot be written, the open is refused with a message that says so.
 // - Foreign keys on; every change runs in a transaction (see UDBSQLiteTransaction).
 // - A busy timeout (10 s by default): a second program that opens a job while another is
 //   writing waits for it instead of failing at once.
@@ -79,8 +81,10 @@ class JobDatabase {
                               const JobOpenOptions& options = {});
 
     /// Opens an existing job. Throws JobError when there is no such file, it is not a job, its
-    /// schema is newer than kJobSchemaVersion, or it is read-only (or in a read-only folder)
-    /// and options.access asks for writing. An older schema is upgraded in one transaction.
+    /// schema is newer than kJobSchemaVersion, it is read-only (or in a read-only folder)
+    /// and options.access asks for writing, or a program stopped in the middle of a change
+    /// and the file cannot be written to undo it. An older schema is upgraded in one
+    /// transaction.
     static JobDatabase Open(const std::string& path, const JobOpenOptions& options = {});
 
     JobDatabase(JobDatabase&& other) noexcept;
@@ -120,6 +124,8 @@ class JobDatabase {
 
   private:
     struct Impl;
+    /// Open without the recovery of a change that a stopped program left.
+    static JobDatabase OpenConnection(const std::string& path, const JobOpenOptions& options);
     explicit JobDatabase(std::unique_ptr<Impl> impl);
     std::unique_ptr<Impl> impl_;
 };

@@ -1,7 +1,10 @@
 #include "platform/job/UDBPoint.h"
 
+#include <cmath>
+
 #include "platform/job/JobDatabase.h"
 #include "platform/job/USurveyDoc.h"
+#include "platform/messages/Translate.h"
 #include "platform/text/WideText.h"
 
 UDBPoint::UDBPoint(USurveyDoc* job, long id) : UDBObject(job, nedit::kPointKind, "point") {
@@ -46,6 +49,12 @@ void UDBPoint::ReInit() {
 bool UDBPoint::Save(int /*undoFlag*/, bool /*redraw*/, bool /*select*/) {
     if (nedit::Trim(name_).empty()) {
         Fail(L"A point needs a name.");
+        return false;
+    }
+    // An overflow must not put "inf" into a job, nor a NaN that the file would hold as NULL,
+    // read back as "no height".
+    if (!std::isfinite(east_) || !std::isfinite(north_) || !std::isfinite(height_)) {
+        Fail(nedit::Translate(L"The coordinates of point {1} are not finite numbers.", {name_}));
         return false;
     }
     if (id_ != 0 && !CanUpdate()) return false;

@@ -34,7 +34,7 @@ class UDBPoint : public UDBObject {
     /// Back to a new, empty point of the same job.
     void ReInit();
     /// Stores the point. False (LastError) for an empty name, a name another point has, a
-    /// locked point, an unknown layer.
+    /// locked point, an unknown layer, coordinates that are not finite numbers.
     bool Save(int undoFlag = 0, bool redraw = false, bool select = false) override;
 
     const std::wstring& GetName() const { return name_; }

@@ -8,7 +8,15 @@ UReportDoc::UReportDoc(std::wstring title) : Title(std::move(title)) {}
 UReportDoc::~UReportDoc() = default;
 
 void UReportDoc::NewLines(int count) {
-    for (int i = 0; i < count; ++i) Text.emplace_back();
+    for (int i = 0; i < count; ++i) {
+        Text.emplace_back();
+        if (PageLength > 0 && LinesOnPage() >= PageLength) BreakPage();
+    }
+}
+
+void UReportDoc::BreakPage() {
+    PageStart = static_cast<int>(Text.size()) - 1;
+    PageBreaks.push_back(Text.size() - 1);
 }
 
 void UReportDoc::WriteText(const std::wstring& text, int linesBefore, int linesAfter,
@@ -20,8 +28,7 @@ void UReportDoc::WriteText(const std::wstring& text, int linesBefore, int linesA
 
 void UReportDoc::KeepLines(int count) {
     if (PageLength <= 0 || LinesOnPage() == 0 || LinesOnPage() + count <= PageLength) return;
-    PageStart = static_cast<int>(Text.size()) - 1;
-    PageBreaks.push_back(Text.size() - 1);
+    BreakPage();
 }
 
 void UReportDoc::Clear() {
@@ -35,8 +42,10 @@ std::wstring UReportDoc::GetText() const {
     std::size_t next_break = 0;
     for (std::size_t i = 0; i < Text.size(); ++i) {
         if (i > 0) out += L'\n';
+        // A page that ends the report full has nothing behind it.
+        const bool empty_end = i + 1 == Text.size() && Text[i].empty();
         if (next_break < PageBreaks.size() && PageBreaks[next_break] == i) {
-            out += L'\f';
+            if (!empty_end) out += L'\f';
             ++next_break;
         }
         out += Text[i];

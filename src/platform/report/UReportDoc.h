@@ -1,6 +1,8 @@
 #pragma once
 // A text report: lines written piece by piece, kept together on pages, saved as plain text.
-// A page break stands as a form feed at the start of the first line of the new page.
+// A page holds the page length in lines; the line after a full page, or a block that would
+// not fit on the rest of one (KeepLines), begins the next page. A page break stands as a form
+// feed at the start of the first line of the new page.
 
 #include <string>
 #include <vector>
@@ -37,6 +39,8 @@ class UReportDoc {
     bool SaveAsText(const std::string& path) const;
 
   private:
+    /// The line being written begins a new page.
+    void BreakPage();
     int LinesOnPage() const { return static_cast<int>(Text.size()) - 1 - PageStart; }
 
     std::wstring Title;

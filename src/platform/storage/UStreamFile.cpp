@@ -39,7 +39,7 @@ int UStreamFile::ReadString(std::wstring& line) {
     const std::size_t stop = end == std::string::npos ? data_.size() : end;
     std::size_t length = stop - position_;
     if (length > 0 && data_[position_ + length - 1] == '\r') --length;
-    line = nedit::FromUtf8(std::string_view(data_).substr(position_, length));
+    line = nedit::DecodeTextLine(std::string_view(data_).substr(position_, length));
     position_ = end == std::string::npos ? data_.size() : end + 1;
     return 1;
 }

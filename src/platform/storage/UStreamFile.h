@@ -1,7 +1,8 @@
 #pragma once
 // One named stream of a storage, read and written as a whole in memory: streams hold the
-// records of a raw-data document and its settings, which are small. Text goes in and out as
-// UTF-8 lines ending in a line feed.
+// records of a raw-data document and its settings, which are small. Text goes out as UTF-8
+// lines ending in a line feed, and comes in as a file's lines do: a line that is not valid
+// UTF-8 (a neutral file of an older program, stored as it was) is read as Latin-1.
 //
 // What is written reaches the storage only through Close. Abort, or destroying an open
 // stream without Close, discards the writes, so a failure in the middle of writing never

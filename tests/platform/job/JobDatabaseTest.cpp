@@ -1,6 +1,8 @@
 #include <gtest/gtest.h>
 #include <sqlite3.h>
 #include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 #include "JobTestSupport.h"
 #include "platform/job/JobDatabase.h"
@@ -85,4 +87,67 @@ TEST(JobOpen, ReadOnlyFileCanOnlyBeRead) {
               "The job " + path + " is open read-only and cannot be changed.");
     // Table look-ups that would add a name give 0 instead of failing.
     EXPECT_EQ(job.SymbolIndex(L"NEW"), 0);
+}
+
+namespace {
+
+// A job that a program left in the middle of a transaction, as kill -9 leaves it: changed
+// pages in the file, the old ones in its journal.
+std::string JobLeftWithAHotJournal(const TempDir& dir) {
+    const std::string path = dir.File("crashed.job");
+    {
+        auto job = USurveyDoc::CreateJob(path, nullptr);
+        UDBPoint point(job.get(), UWPoint(1.0, 2.0, 3.0));
+        point.SetName(L"KEPT");
+        EXPECT_TRUE(point.Save());
+    }
+    const pid_t child = fork();
+    if (child == 0) {
+        JobDatabase job = JobDatabase::Open(path);
+        job.Execute("PRAGMA cache_size = 1");  // so that changed pages reach the file
+        job.BeginLevel();
+        for (int i = 0; i < 2000; ++i) {
+            job.Execute("INSERT INTO point (name, east, north) VALUES ('LOST" + std::to_string(i) +
+                        "', 0, 0)");
+        }
+        _exit(0);  // no commit, no rollback, no close
+    }
+    int status = 0;
+    waitpid(child, &status, 0);
+    EXPECT_TRUE(WIFEXITED(status));
+    struct stat journal {};
+    EXPECT_EQ(stat((path + "-journal").c_str(), &journal), 0) << "no journal was left";
+    return path;
+}
+
+long long PointCount(JobDatabase& job) {
+    auto query = job.Query("SELECT count(*) FROM point");
+    return query->Step() ? query->Int(0) : -1;
+}
+
+}  // namespace
+
+TEST(JobOpen, AJobLeftInATransactionIsRolledBackWhenOpenedForReading) {
+    TempDir dir;
+    const std::string path = JobLeftWithAHotJournal(dir);
+    JobOpenOptions readOnly;
+    readOnly.access = JobAccess::ReadOnly;
+    JobDatabase job = JobDatabase::Open(path, readOnly);
+    EXPECT_EQ(PointCount(job), 1);
+    EXPECT_TRUE(job.IsReadOnly());
+    struct stat journal {};
+    EXPECT_NE(stat((path + "-journal").c_str(), &journal), 0) << "the journal is still there";
+}
+
+TEST(JobOpen, AJobLeftInATransactionThatCannotBeWrittenNeedsRecovery) {
+    TempDir dir;
+    const std::string path = JobLeftWithAHotJournal(dir);
+    ASSERT_EQ(chmod(path.c_str(), 0444), 0);
+    JobOpenOptions readOnly;
+    readOnly.access = JobAccess::ReadOnly;
+    EXPECT_EQ(ErrorOf([&] { JobDatabase::Open(path, readOnly); }),
+              "The job " + path +
+                  " was left in the middle of a change by a program that stopped. It needs "
+                  "recovery, which a program that may write the job does when it opens it: "
+                  "make the file writable and open it again.");
 }

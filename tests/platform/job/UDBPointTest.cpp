@@ -1,5 +1,7 @@
 #include <gtest/gtest.h>
 
+#include <limits>
+
 #include "JobTestSupport.h"
 #include "platform/job/UDBLayer.h"
 #include "platform/job/UDBPoint.h"
@@ -102,6 +104,22 @@ TEST_F(UDBPointTest, NamesAreUniqueAndCompareExactly) {
     twin.SetLayer(4242);  // no such layer
     EXPECT_FALSE(twin.Save());
     EXPECT_EQ(job->GetPointId(UPointNumber(L"P2")), 0);
+}
+
+TEST_F(UDBPointTest, CoordinatesThatAreNotFiniteNumbersNeverReachTheJob) {
+    const double infinity = std::numeric_limits<double>::infinity();
+    const double nan = std::numeric_limits<double>::quiet_NaN();
+    for (const UWPoint& bad : {UWPoint(infinity, 1, 0), UWPoint(1, -infinity, 0),
+                               UWPoint(nan, 1, 0), UWPoint(1, 1, infinity), UWPoint(1, 1, nan)}) {
+        UDBPoint point(job.get(), bad);
+        point.SetName(L"OVERFLOW");
+        EXPECT_FALSE(point.Save());
+        EXPECT_EQ(point.LastError(), L"The coordinates of point OVERFLOW are not finite numbers.");
+    }
+    EXPECT_EQ(job->GetPointId(UPointNumber(L"OVERFLOW")), 0);
+    UDBPoint none(job.get(), UWPoint(1, 1, UWPoint::kNoHeight));
+    none.SetName(L"NO HEIGHT");
+    EXPECT_TRUE(none.Save());
 }
 
 TEST_F(UDBPointTest, ALockedPointIsSavedOnlyAfterUnlocking) {

@@ -35,3 +35,19 @@ TEST(UReportDoc, SavesItsTextAsUtf8) {
     ASSERT_TRUE(report.SaveAsText(path));
     EXPECT_FALSE(report.SaveAsText(::testing::TempDir() + "no/such/dir/report.txt"));
 }
+
+TEST(UReportDoc, AFullPageBeginsTheNextWithAFormFeed) {
+    UReportDoc report;
+    report.SetPageLength(5);
+    for (int line = 0; line < 12; ++line) report.WriteText(std::to_wstring(line), 0, 1);
+    EXPECT_EQ(report.GetText(), L"0\n1\n2\n3\n4\n\f5\n6\n7\n8\n9\n\f10\n11\n");
+    // A page that ends the report full gives no empty page behind it.
+    report.Clear();
+    for (int line = 0; line < 10; ++line) report.WriteText(std::to_wstring(line), 0, 1);
+    EXPECT_EQ(report.GetText(), L"0\n1\n2\n3\n4\n\f5\n6\n7\n8\n9\n");
+    // Blank lines count as lines.
+    report.Clear();
+    report.WriteText(L"head", 0, 6);
+    report.WriteText(L"next", 0, 0);
+    EXPECT_EQ(report.GetText(), L"head\n\n\n\n\n\f\nnext");
+}
