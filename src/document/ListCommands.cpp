@@ -51,7 +51,7 @@ int UListCtrl::CopyRows() {
     const int end = RunEnd(first);
     std::wstring text;
     for (int row = end; row >= start; --row) {
-        text += rows_[static_cast<std::size_t>(row)];
+        text += GetItemText(row);
         text += L"\r\n";
     }
     if (!clipboard_->SetText(text)) return 0;
@@ -135,7 +135,7 @@ void UListCtrl::UncommentRow() {
 // ---- Stepping by record type ---------------------------------------------------------------
 
 int UListCtrl::RowType(int row) const {
-    const std::wstring& text = rows_[static_cast<std::size_t>(row)];
+    const std::wstring text = GetItemText(row);
     if (nedit::StartsWith(nedit::TrimLeftView(text), L"#")) return 0;
     return format_->GetRecordType(text);
 }
@@ -184,7 +184,7 @@ int UListCtrl::FindText(const std::wstring& text, bool down, bool matchCase, boo
     if (count == 0 || text.empty()) return 0;
     const std::wstring needle = matchCase ? text : nedit::ToLower(text);
     auto matches = [&](int row) {
-        const std::wstring& raw = rows_[static_cast<std::size_t>(row)];
+        const std::wstring raw = GetItemText(row);
         const std::wstring hay = matchCase ? raw : nedit::ToLower(raw);
         const std::size_t at = hay.find(needle);
         if (at == std::wstring::npos) return false;
@@ -226,7 +226,7 @@ void UListCtrl::HighlightRecordPoint() {
     if (graphic_ == nullptr) return;
     const int row = GetFirstSelected();
     if (row < 0) return;
-    const std::wstring& text = rows_[static_cast<std::size_t>(row)];
+    const std::wstring text = GetItemText(row);
     const std::size_t id = text.find(L"ID=");
     if (id == std::wstring::npos) return;
     const std::size_t comma = text.find(L',', id + 3);

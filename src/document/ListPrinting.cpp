@@ -33,6 +33,6 @@ nedit::ListPage UListCtrl::PrintPage(int page, int pageSize) const {
     const int last = pageSize <= 0 ? count : std::min(first + pageSize, count);
     printed.heading = nedit::Format(L"Page %d of %d", page, pages);
     printed.firstRow = first;
-    printed.rows.assign(rows_.begin() + first, rows_.begin() + last);
+    for (int row = first; row < last; ++row) printed.rows.push_back(GetItemText(row));
     return printed;
 }

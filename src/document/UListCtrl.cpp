@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "platform/text/Format.h"
+#include "platform/text/TextLines.h"
 #include "platform/text/WideText.h"
 #include "records/RecordText.h"
 
@@ -15,31 +16,56 @@ std::wstring UListCtrl::NormaliseRecord(const std::wstring& text) const {
 }
 
 int UListCtrl::AddRecord(int row, const std::wstring& text) {
-    std::wstring normalised = NormaliseRecord(text);
+    return InsertRecord(row, nedit::ToUtf8(NormaliseRecord(text)));
+}
+
+int UListCtrl::AddRecordUtf8(int row, std::string_view text) {
+    std::string normalised;
+    NormaliseRowUtf8(*format_, text, normalised);
+    return InsertRecord(row, normalised);
+}
+
+int UListCtrl::InsertRecord(int row, std::string_view normalised) {
     if (normalised.empty()) return -1;
     if (row < 0 || row > GetItemCount()) row = GetItemCount();
-    InsertRow(row, std::move(normalised));
+    InsertRow(row, normalised);
     // A download adds a row at a time; rebuilding the form for each would only slow it.
-    if (form_ != nullptr && !IsAbortProcessOn())
-        ShowRecord(rows_[static_cast<std::size_t>(row)], row);
+    if (form_ != nullptr && !IsAbortProcessOn()) ShowRecord(GetItemText(row), row);
     return row;
 }
 
 int UListCtrl::SetRecord(int row, const std::wstring& text) {
-    std::wstring normalised = NormaliseRecord(text);
+    const std::wstring normalised = NormaliseRecord(text);
     if (normalised.empty() || !InRange(row)) return -1;
-    ReplaceRow(row, std::move(normalised));
+    ReplaceRow(row, normalised);
     return row;
 }
 
 std::wstring UListCtrl::GetItemText(int row) const {
     if (!InRange(row)) return {};
+    return nedit::FromUtf8(rows_[static_cast<std::size_t>(row)]);
+}
+
+std::string_view UListCtrl::GetRowUtf8(int row) const {
+    if (!InRange(row)) return {};
     return rows_[static_cast<std::size_t>(row)];
+}
+
+const std::vector<std::wstring>& UListCtrl::GetRows() const {
+    if (wide_rows_revision_ != GetRevision()) {
+        wide_rows_.clear();
+        wide_rows_.reserve(rows_.size());
+        for (std::size_t row = 0; row < rows_.size(); ++row)
+            wide_rows_.push_back(nedit::FromUtf8(rows_[row]));
+        wide_rows_revision_ = GetRevision();
+    }
+    return wide_rows_;
 }
 
 void UListCtrl::DeleteAllItems() {
     const bool had_selection = GetFirstSelected() >= 0 || focus_ >= 0;
     rows_.clear();
+    RowsChanged();
     selected_.clear();
     focus_ = anchor_ = drop_target_ = -1;
     if (events_ != nullptr) events_->RowsCleared();
@@ -50,24 +76,27 @@ void UListCtrl::DeleteItem(int row) {
     if (InRange(row)) RemoveRows(row, 1);
 }
 
-void UListCtrl::Reserve(std::size_t rows) {
-    rows_.reserve(rows);
+void UListCtrl::Reserve(std::size_t rows, std::size_t bytes) {
+    rows_.reserve(rows, bytes);
     selected_.reserve(rows);
 }
 
 void UListCtrl::InsertRows(int row, std::vector<std::wstring> texts) {
     if (texts.empty()) return;
-    rows_.insert(rows_.begin() + row, std::make_move_iterator(texts.begin()),
-                 std::make_move_iterator(texts.end()));
+    std::vector<std::string> lines;
+    lines.reserve(texts.size());
+    for (const std::wstring& text : texts) lines.push_back(nedit::ToUtf8(text));
+    rows_.insert(static_cast<std::size_t>(row), lines);
     RowsAdded(row, static_cast<int>(texts.size()));
 }
 
-void UListCtrl::InsertRow(int row, std::wstring text) {
-    rows_.insert(rows_.begin() + row, std::move(text));
+void UListCtrl::InsertRow(int row, std::string_view text) {
+    rows_.insert(static_cast<std::size_t>(row), text);
     RowsAdded(row, 1);
 }
 
 void UListCtrl::RowsAdded(int row, int count) {
+    RowsChanged();
     selected_.insert(selected_.begin() + row, static_cast<std::size_t>(count), 0);
     // Focus and anchor stay on the rows they were on, which have moved down.
     if (focus_ >= row) focus_ += count;
@@ -80,7 +109,8 @@ void UListCtrl::RemoveRows(int row, int count) {
     if (row < 0 || count <= 0) return;
     const auto first = selected_.begin() + row;
     const bool lost_selection = std::find(first, first + count, 1) != first + count;
-    rows_.erase(rows_.begin() + row, rows_.begin() + row + count);
+    rows_.erase(static_cast<std::size_t>(row), static_cast<std::size_t>(count));
+    RowsChanged();
     selected_.erase(first, first + count);
     bool lost_focus = false;
     if (focus_ >= row + count) {
@@ -98,8 +128,9 @@ void UListCtrl::RemoveRows(int row, int count) {
     if (lost_selection || lost_focus) NotifySelection();
 }
 
-void UListCtrl::ReplaceRow(int row, std::wstring text) {
-    rows_[static_cast<std::size_t>(row)] = std::move(text);
+void UListCtrl::ReplaceRow(int row, const std::wstring& text) {
+    rows_.replace(static_cast<std::size_t>(row), nedit::ToUtf8(text));
+    RowsChanged();
     if (events_ != nullptr) events_->RowChanged(row);
 }
 

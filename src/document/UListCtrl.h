@@ -28,6 +28,7 @@
 #include <vector>
 
 #include "document/ListInterfaces.h"
+#include "platform/text/TextLines.h"
 #include "records/RowSource.h"
 
 class UNeutralFileFormat;
@@ -95,6 +96,8 @@ class UListCtrl : public nedit::RowSource {
     /// the end appends). Gives the row it went in at, or -1. A row that went in is shown in
     /// the form, except while a long operation runs.
     int AddRecord(int row, const std::wstring& text) override;
+    /// The same for UTF-8 text.
+    int AddRecordUtf8(int row, std::string_view text) override;
     /// Normalises `text` and, when the result is not empty and `row` exists, replaces the
     /// row's text. Gives the row, or -1.
     int SetRecord(int row, const std::wstring& text) override;
@@ -104,13 +107,16 @@ class UListCtrl : public nedit::RowSource {
     int GetItemCount() const override { return static_cast<int>(rows_.size()); }
     /// The row's text; empty for a row that does not exist.
     std::wstring GetItemText(int row) const override;
+    std::string_view GetRowUtf8(int row) const override;
     /// Removes every row, with the selection and the focus.
     void DeleteAllItems() override;
     /// Removes the row; a row that does not exist is left alone.
     void DeleteItem(int row) override;
-    void Reserve(std::size_t rows);
-    /// All rows, in order, for readers that walk the whole list.
-    const std::vector<std::wstring>& GetRows() const override { return rows_; }
+    /// Room for `rows` rows of `bytes` bytes in all.
+    void Reserve(std::size_t rows, std::size_t bytes = 0);
+    /// All rows as wide text, made when asked for and kept until the rows change: for tests
+    /// and short lists. Readers of many rows take GetRowUtf8, which copies nothing.
+    const std::vector<std::wstring>& GetRows() const;
 
     // ---- Selection and focus. Rows that do not exist are ignored by the setters.
     int GetSelectedCount() const;
@@ -226,14 +232,16 @@ class UListCtrl : public nedit::RowSource {
 
   private:
     bool InRange(int row) const { return row >= 0 && row < GetItemCount(); }
+    /// A row that has passed the gate goes in at `row` (a row past the end appends).
+    int InsertRecord(int row, std::string_view normalised);
     /// Inserts rows as they are, unselected, keeping selection and focus on their rows.
     void InsertRows(int row, std::vector<std::wstring> texts);
-    void InsertRow(int row, std::wstring text);
+    void InsertRow(int row, std::string_view text);
     /// Selection, focus and listeners follow `count` rows put in at `row`.
     void RowsAdded(int row, int count);
     /// Removes `count` rows from `row` on.
     void RemoveRows(int row, int count);
-    void ReplaceRow(int row, std::wstring text);
+    void ReplaceRow(int row, const std::wstring& text);
     /// Only `row` selected and focused, or nothing selected for a row out of range.
     void SelectOnly(int row);
     void NotifySelection();
@@ -250,7 +258,9 @@ class UListCtrl : public nedit::RowSource {
     void MarkFormModified();
 
     const UNeutralFileFormat* format_;
-    std::vector<std::wstring> rows_;
+    nedit::TextLines rows_;  // UTF-8
+    mutable std::vector<std::wstring> wide_rows_;
+    mutable std::uint64_t wide_rows_revision_ = ~std::uint64_t{0};
     std::vector<char> selected_;  // beside rows_, one flag per row
     int focus_ = -1;
     int anchor_ = -1;  // where a Shift selection starts

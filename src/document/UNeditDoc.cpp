@@ -61,18 +61,23 @@ int UNeditDoc::Load(UListCtrl* list) {
     if (list == nullptr || storage == nullptr ||
         !stream.OpenStream(*storage, kNeutralDataStream, kReadMode))
         return 0;
+    // The document's own list is its text; the text read into another list is kept here.
+    const bool keep_text = list != List.get();
     NeuText.clear();
     NamelessCoordinates coordinates;
-    std::wstring line;
+    std::string_view bytes;
+    std::string decoded;
+    std::string upper;
+    std::string completed;
     bool first = true;
-    while (stream.ReadString(line)) {
+    while (stream.ReadLine(bytes)) {
         if (stream.GetLength() > 0) {
             Progress->Update(static_cast<int>(100 * stream.GetPosition() / stream.GetLength()),
                              L"");
         }
-        if (line.empty()) {
+        if (bytes.empty()) {
             int rest = 0;
-            while (stream.ReadString(line)) ++rest;
+            while (stream.ReadLine(bytes)) ++rest;
             if (rest > 0) {
                 nedit::AppMessageBox(Host,
                                      nedit::Translate(L"The records of {1} end at an empty line; "
@@ -82,11 +87,18 @@ int UNeditDoc::Load(UListCtrl* list) {
             }
             break;
         }
-        if (first) line = MakeUpperCaseString(line);
+        std::string_view line = nedit::TextLineAsUtf8(bytes, decoded);
+        if (first) {
+            upper = nedit::ToUpperUtf8(line);
+            line = upper;
+        }
         first = false;
-        line = coordinates.Complete(*this, GetRecordType(line), line);
-        if (list->AddRecord(list->GetItemCount(), line) >= 0)
-            NeuText += list->GetItemText(list->GetItemCount() - 1) + L"\n";
+        coordinates.CompleteUtf8(*this, GetRecordTypeUtf8(line), line, completed);
+        const int row = list->AddRecordUtf8(list->GetItemCount(), completed);
+        if (row >= 0 && keep_text) {
+            NeuText += list->GetRowUtf8(row);
+            NeuText += '\n';
+        }
         if (GetAbortProcess()) break;
     }
     stream.Abort();
@@ -109,14 +121,19 @@ int UNeditDoc::Save(UListCtrl* list, int additionPoints) {
     if (storage == nullptr || !stream.CreateStream(*storage, kNeutralDataStream, kCreateMode))
         return 0;
     if (list != nullptr) {
+        const bool keep_text = list != List.get();
         NeuText.clear();
-        for (const std::wstring& row : list->GetRows()) {
-            stream.WriteString(row);
-            NeuText += row + L"\n";
+        for (int row = 0; row < list->GetItemCount(); ++row) {
+            const std::string_view text = list->GetRowUtf8(row);
+            stream.Write(text.data(), text.size());
+            stream.Write("\n", 1);
+            if (keep_text) {
+                NeuText += text;
+                NeuText += '\n';
+            }
         }
     } else {
-        const std::string bytes = nedit::ToUtf8(NeuText);
-        stream.Write(bytes.data(), bytes.size());
+        stream.Write(NeuText.data(), NeuText.size());
     }
     stream.Close();
     return WriteSettingsStream();
@@ -136,7 +153,10 @@ int UNeditDoc::WriteSettingsStream() {
 int UNeditDoc::Save(const std::wstring& path, const UListCtrl* list) const {
     std::string text;
     if (list != nullptr) {
-        for (const std::wstring& row : list->GetRows()) text += nedit::ToUtf8(row) + '\n';
+        for (int row = 0; row < list->GetItemCount(); ++row) {
+            text += list->GetRowUtf8(row);
+            text += '\n';
+        }
     }
     return nedit::ReplaceFile(nedit::ToUtf8(path), text) ? 1 : 0;
 }
@@ -149,7 +169,11 @@ void UNeditDoc::CopyDocument(UNeditDoc& target) {
     UStorage* storage = GetStorage();
     UStreamFile stream;
     if (storage != nullptr && stream.OpenStream(*storage, kNeutralDataStream, kReadMode)) {
-        for (std::wstring line; stream.ReadString(line);) target.NeuText += line + L"\n";
+        std::string decoded;
+        for (std::string_view bytes; stream.ReadLine(bytes);) {
+            target.NeuText += nedit::TextLineAsUtf8(bytes, decoded);
+            target.NeuText += '\n';
+        }
         stream.Abort();
     }
     target.NeditSettings = NeditSettings;

@@ -113,7 +113,6 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     const UJobSettings& GetSettings() const override { return Settings; }
     const UNeutralFileFormat& GetRecordFormat() const override { return *this; }
     UNeditSettings& GetNeditSettings() { return NeditSettings; }
-    const std::wstring& GetNeuText() const { return NeuText; }
     const std::wstring& GetNeuFileName() const { return NeuFileName; }
     void SetNeuFileName(const std::wstring& name) { NeuFileName = name; }
     /// The host of the document's messages, and of its list's.
@@ -189,7 +188,7 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     nedit::DialogHost* Host = nullptr;
     nedit::ProgressSink OwnProgress;
     nedit::ProgressSink* Progress = &OwnProgress;
-    std::wstring NeuText;
+    std::string NeuText;  // UTF-8; the text of a list other than the document's own
     std::wstring NeuFileName;
     std::unique_ptr<UListCtrl> List;
     std::unique_ptr<UNeditDatabase> Database;

@@ -1,5 +1,7 @@
 #include "records/NamelessCoordinates.h"
 
+#include <algorithm>
+
 #include "platform/text/WideText.h"
 #include "records/RecordText.h"
 #include "records/RecordTypes.h"
@@ -7,8 +9,27 @@
 
 std::wstring NamelessCoordinates::Complete(const UNeutralFileFormat& format, int type,
                                            const std::wstring& row) {
-    if (type == rec::Stn || type == rec::Bkb) IdText = GetIdText(row);
+    if (type == rec::Stn || type == rec::Bkb) {
+        IdText = GetIdText(row);
+        IdTextUtf8 = nedit::ToUtf8(IdText);
+    }
     if (type == rec::Xyz && nedit::CountOf(row, L',') <= 2)
         return format.ReformatRecord(row, IdText);
     return row;
+}
+
+void NamelessCoordinates::CompleteUtf8(const UNeutralFileFormat& format, int type,
+                                       std::string_view row, std::string& out) {
+    if (type == rec::Stn || type == rec::Bkb) {
+        IdTextUtf8 = GetIdTextUtf8(row);
+        IdText = nedit::FromUtf8(IdTextUtf8);
+    }
+    const bool nameless = type == rec::Xyz && std::count(row.begin(), row.end(), ',') <= 2;
+    if (!nameless) {
+        out.assign(row);
+    } else if (nedit::IsAscii(row.substr(0, row.find(' ')))) {
+        out = format.ReformatRecordUtf8(row, IdTextUtf8);
+    } else {
+        out = nedit::ToUtf8(format.ReformatRecord(nedit::FromUtf8(row), IdText));
+    }
 }

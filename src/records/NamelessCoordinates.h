@@ -4,6 +4,7 @@
 // rows through one of these, in order.
 
 #include <string>
+#include <string_view>
 
 class UNeutralFileFormat;
 
@@ -13,7 +14,11 @@ class NamelessCoordinates {
     /// ID field of the last station or back-bearing record before it (an empty one before
     /// any), other rows stay as they are.
     std::wstring Complete(const UNeutralFileFormat& format, int type, const std::wstring& row);
+    /// The same for a row in UTF-8, into `out`.
+    void CompleteUtf8(const UNeutralFileFormat& format, int type, std::string_view row,
+                      std::string& out);
 
   private:
     std::wstring IdText;
+    std::string IdTextUtf8;  // the same text
 };

@@ -89,20 +89,24 @@ bool RecordDefinitionTable::ParseLine(const std::vector<std::wstring>& words, st
         }
     }
     record_types_by_key_[record.key] = record.type;
+    record_types_by_utf8_key_[nedit::ToUtf8(record.key)] = record.type;
     records_[record.type] = std::move(record);
     return true;
 }
 
 void RecordDefinitionTable::AddField(FieldDefinition field) {
     field_ids_by_key_[field.key] = field.id;
+    field_ids_by_utf8_key_[nedit::ToUtf8(field.key)] = field.id;
     fields_[field.id] = std::move(field);
 }
 
 void RecordDefinitionTable::Clear() {
     records_.clear();
     record_types_by_key_.clear();
+    record_types_by_utf8_key_.clear();
     fields_.clear();
     field_ids_by_key_.clear();
+    field_ids_by_utf8_key_.clear();
 }
 
 const RecordDefinition* RecordDefinitionTable::RecordByType(int type) const {
@@ -115,6 +119,11 @@ const RecordDefinition* RecordDefinitionTable::RecordByKey(const std::wstring& k
     return found == record_types_by_key_.end() ? nullptr : RecordByType(found->second);
 }
 
+const RecordDefinition* RecordDefinitionTable::RecordByKeyUtf8(std::string_view key) const {
+    const auto found = record_types_by_utf8_key_.find(std::string(key));
+    return found == record_types_by_utf8_key_.end() ? nullptr : RecordByType(found->second);
+}
+
 const FieldDefinition* RecordDefinitionTable::FieldById(int id) const {
     const auto found = fields_.find(id);
     return found == fields_.end() ? nullptr : &found->second;
@@ -123,4 +132,9 @@ const FieldDefinition* RecordDefinitionTable::FieldById(int id) const {
 const FieldDefinition* RecordDefinitionTable::FieldByKey(const std::wstring& key) const {
     const auto found = field_ids_by_key_.find(key);
     return found == field_ids_by_key_.end() ? nullptr : FieldById(found->second);
+}
+
+const FieldDefinition* RecordDefinitionTable::FieldByKeyUtf8(std::string_view key) const {
+    const auto found = field_ids_by_utf8_key_.find(std::string(key));
+    return found == field_ids_by_utf8_key_.end() ? nullptr : FieldById(found->second);
 }

@@ -3,6 +3,7 @@
 // and how each field's value is read. Loaded from a definition text shipped under data/.
 
 #include <string>
+#include <string_view>
 #include <unordered_map>
 #include <vector>
 
@@ -38,10 +39,13 @@ class RecordDefinitionTable {
 
     const RecordDefinition* RecordByType(int type) const;
     const RecordDefinition* RecordByKey(const std::wstring& key) const;
+    /// The same for a key in UTF-8.
+    const RecordDefinition* RecordByKeyUtf8(std::string_view key) const;
     /// Fields by id and by key. The key of a single-field record is also a field key, with
     /// the record's type as its id, so that its one value can be named.
     const FieldDefinition* FieldById(int id) const;
     const FieldDefinition* FieldByKey(const std::wstring& key) const;
+    const FieldDefinition* FieldByKeyUtf8(std::string_view key) const;
 
   private:
     bool ParseLine(const std::vector<std::wstring>& words, std::wstring& error);
@@ -49,6 +53,8 @@ class RecordDefinitionTable {
 
     std::unordered_map<int, RecordDefinition> records_;
     std::unordered_map<std::wstring, int> record_types_by_key_;
+    std::unordered_map<std::string, int> record_types_by_utf8_key_;
     std::unordered_map<int, FieldDefinition> fields_;
     std::unordered_map<std::wstring, int> field_ids_by_key_;
+    std::unordered_map<std::string, int> field_ids_by_utf8_key_;
 };

@@ -55,17 +55,30 @@ std::wstring ReplaceToken(std::wstring_view record, int n, std::wstring_view val
     return out;
 }
 
-std::wstring GetIdText(std::wstring_view record) {
-    const std::size_t comma = record.find(L',');
-    if (comma == std::wstring_view::npos) {
-        const std::size_t blank = record.find(L' ');
+namespace {
+
+template <typename Char>
+std::basic_string_view<Char> IdText(std::basic_string_view<Char> record) {
+    using View = std::basic_string_view<Char>;
+    const std::size_t comma = record.find(Char(','));
+    if (comma == View::npos) {
+        const std::size_t blank = record.find(Char(' '));
         // A formatted row pads its key with blanks; the text meant is the field after them.
-        return blank == std::wstring_view::npos ? std::wstring()
-                                                : nedit::TrimLeft(record.substr(blank + 1));
+        return blank == View::npos ? View() : nedit::TrimLeftView(record.substr(blank + 1));
     }
-    const std::size_t blank = record.rfind(L' ', comma);
-    const std::size_t start = blank == std::wstring_view::npos ? 0 : blank + 1;
-    return std::wstring(record.substr(start, comma - start));
+    const std::size_t blank = record.rfind(Char(' '), comma);
+    const std::size_t start = blank == View::npos ? 0 : blank + 1;
+    return record.substr(start, comma - start);
+}
+
+}  // namespace
+
+std::wstring GetIdText(std::wstring_view record) {
+    return std::wstring(IdText(record));
+}
+
+std::string_view GetIdTextUtf8(std::string_view record) {
+    return IdText(record);
 }
 
 int GetAngleType(std::wstring_view row) {
@@ -101,4 +114,27 @@ std::wstring NormaliseRow(const UNeutralFileFormat& format, const std::wstring& 
     }
     if (row.size() > static_cast<std::size_t>(kMaxRowLength)) row.resize(kMaxRowLength);
     return row;
+}
+
+void NormaliseRowUtf8(const UNeutralFileFormat& format, std::string_view text, std::string& out) {
+    if (!nedit::IsAscii(text)) {
+        out = nedit::ToUtf8(NormaliseRow(format, nedit::FromUtf8(text)));
+        return;
+    }
+    const std::string_view trimmed = nedit::TrimView(text);
+    std::string row(trimmed);
+    for (char& c : row) {
+        if (c >= 'a' && c <= 'z') c = static_cast<char>(c - 32);
+    }
+    if (!row.empty() && row[0] != '#') {
+        int type = rec::None;
+        if (format.FindRecordKeyUtf8(std::string_view(row).substr(0, row.find_first_of(" ,")),
+                                     type)) {
+            row = format.FormatRecordUtf8(row);
+        } else {
+            row.insert(0, "# ");
+        }
+    }
+    if (row.size() > static_cast<std::size_t>(kMaxRowLength)) row.resize(kMaxRowLength);
+    out = std::move(row);
 }

@@ -22,6 +22,8 @@ std::wstring ReplaceToken(std::wstring_view record, int n, std::wstring_view val
 /// "STN       ID=P1,HI=1.500" it is "ID=P1". Without a comma the text after the first
 /// blank; without either, empty.
 std::wstring GetIdText(std::wstring_view record);
+/// The same in UTF-8, as a view into `record`.
+std::string_view GetIdTextUtf8(std::string_view record);
 
 /// The angular unit that a row sets with "UA=": 1 for "1" or "D", 2 for "2" or "G", else 0
 /// (also when the row has no "UA="). Blanks after "=" are skipped.
@@ -32,3 +34,6 @@ int GetAngleType(std::wstring_view row);
 /// comment with "# " in front, so that nothing is lost. The result is cut to the row limit of
 /// 255 characters.
 std::wstring NormaliseRow(const UNeutralFileFormat& format, const std::wstring& text);
+/// The same gate for UTF-8 text, into `out`; a row of ASCII text passes it without being
+/// widened, and gives the same row as NormaliseRow.
+void NormaliseRowUtf8(const UNeutralFileFormat& format, std::string_view text, std::string& out);

@@ -22,6 +22,56 @@ std::wstring KeyOf(std::wstring_view text) {
     return nedit::ToUpper(text.substr(0, std::min(text.find_first_of(L" ,"), text.size())));
 }
 
+// Where the key of a record ends: at its first blank or comma, or at its end.
+template <typename Char>
+std::size_t KeyEnd(std::basic_string_view<Char> text) {
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        if (text[i] == ' ' || text[i] == ',') return i;
+    }
+    return text.size();
+}
+
+// The standard layout of a record: the key padded to nine places and a blank ("%-9s %s"),
+// then the fields separated by commas, blanks around "=" and "," removed. The key is counted
+// in characters, so UTF-8 text must have an ASCII key.
+template <typename Char>
+std::basic_string<Char> LayOutRecord(std::basic_string_view<Char> line) {
+    using View = std::basic_string_view<Char>;
+    const View text = nedit::TrimView(line);
+    if (text.empty() || text[0] == '#') return std::basic_string<Char>(text);
+    const std::size_t key_end = KeyEnd(text);
+    const View key = text.substr(0, key_end);
+    const View body = nedit::TrimView(text.substr(key_end));
+
+    std::basic_string<Char> out;
+    out.reserve(std::max<std::size_t>(key.size(), 9) + 1 + body.size());
+    out.append(key);
+    if (key.size() < 9) out.append(9 - key.size(), ' ');
+    out += ' ';
+    const bool has_fields =
+        std::any_of(body.begin(), body.end(), [](Char c) { return c == ',' || c == '='; });
+    if (!has_fields) {
+        out.append(body);
+    } else {
+        for (std::size_t start = 0; start <= body.size();) {
+            const std::size_t comma = std::min(body.find(Char(','), start), body.size());
+            const View token = nedit::TrimView(body.substr(start, comma - start));
+            if (start > 0) out += ',';
+            const std::size_t equals = token.find(Char('='));
+            if (equals == View::npos) {
+                out.append(token);
+            } else {
+                out.append(nedit::TrimRightView(token.substr(0, equals)));
+                out += '=';
+                out.append(nedit::TrimLeftView(token.substr(equals + 1)));
+            }
+            start = comma + 1;
+        }
+    }
+    out.resize(nedit::TrimRightView(View(out)).size());
+    return out;
+}
+
 int WinTypeOf(FieldKind kind) {
     switch (kind) {
         case FieldKind::Integer:
@@ -92,6 +142,27 @@ int UNeutralFileFormat::GetRecordType(const std::wstring& line) const {
     if (text[0] == L'#') return rec::Comment;
     const RecordDefinition* record = definition_.RecordByKey(KeyOf(text));
     return record == nullptr ? rec::None : record->type;
+}
+
+int UNeutralFileFormat::GetRecordTypeUtf8(std::string_view line) const {
+    const std::string_view text = nedit::TrimLeftView(line);
+    if (text.empty()) return rec::None;
+    if (text[0] == '#') return rec::Comment;
+    const std::string_view key = text.substr(0, KeyEnd(text));
+    if (!nedit::IsAscii(key)) return GetRecordType(nedit::FromUtf8(text));
+    char upper[64];
+    if (key.size() > sizeof upper) return rec::None;  // longer than any key of a definition
+    for (std::size_t i = 0; i < key.size(); ++i)
+        upper[i] = key[i] >= 'a' && key[i] <= 'z' ? static_cast<char>(key[i] - 32) : key[i];
+    const RecordDefinition* record = definition_.RecordByKeyUtf8({upper, key.size()});
+    return record == nullptr ? rec::None : record->type;
+}
+
+int UNeutralFileFormat::FindRecordKeyUtf8(std::string_view key, int& type) const {
+    const RecordDefinition* record = definition_.RecordByKeyUtf8(key);
+    if (record == nullptr) return 0;
+    type = record->type;
+    return 1;
 }
 
 int UNeutralFileFormat::FindRecordKey(int type, std::wstring& key) const {
@@ -213,38 +284,11 @@ void UNeutralFileFormat::ReadValue(FieldKind kind, std::wstring_view text,
 }
 
 std::wstring UNeutralFileFormat::FormatRecord(int /*type*/, const std::wstring& line) const {
-    const std::wstring_view text = nedit::TrimView(line);
-    if (text.empty() || text[0] == L'#') return std::wstring(text);
-    const std::size_t key_end = std::min(text.find_first_of(L" ,"), text.size());
-    const std::wstring_view key = text.substr(0, key_end);
-    const std::wstring_view body = nedit::TrimView(text.substr(key_end));
+    return LayOutRecord(std::wstring_view(line));
+}
 
-    // "%-9s %s": the key padded to nine places and a blank, then the fields.
-    std::wstring out;
-    out.reserve(std::max<std::size_t>(key.size(), 9) + 1 + body.size());
-    out.append(key);
-    if (key.size() < 9) out.append(9 - key.size(), L' ');
-    out += L' ';
-    if (body.find_first_of(L",=") == std::wstring_view::npos) {
-        out.append(body);
-    } else {
-        for (std::size_t start = 0; start <= body.size();) {
-            const std::size_t comma = std::min(body.find(L',', start), body.size());
-            const std::wstring_view token = nedit::TrimView(body.substr(start, comma - start));
-            if (start > 0) out += L',';
-            const std::size_t equals = token.find(L'=');
-            if (equals == std::wstring_view::npos) {
-                out.append(token);
-            } else {
-                out.append(nedit::TrimRightView(token.substr(0, equals)));
-                out += L'=';
-                out.append(nedit::TrimLeftView(token.substr(equals + 1)));
-            }
-            start = comma + 1;
-        }
-    }
-    out.resize(nedit::TrimRightView(out).size());
-    return out;
+std::string UNeutralFileFormat::FormatRecordUtf8(std::string_view line) const {
+    return LayOutRecord(line);
 }
 
 std::wstring UNeutralFileFormat::ReformatRecord(const std::wstring& record,
@@ -257,6 +301,24 @@ std::wstring UNeutralFileFormat::ReformatRecord(const std::wstring& record,
     const std::size_t last_blank = record.rfind(L' ', comma);
     const std::size_t rest = last_blank == std::wstring::npos ? 0 : last_blank + 1;
     return nedit::Format(L"%-10s%s,%s", key, id, std::wstring_view(record).substr(rest));
+}
+
+std::string UNeutralFileFormat::ReformatRecordUtf8(std::string_view record,
+                                                   std::string_view id) const {
+    const std::size_t comma = record.find(',');
+    if (comma == std::string_view::npos) return std::string(record);
+    const std::string_view key = nedit::TrimView(record.substr(0, record.find(' ')));
+    const std::size_t last_blank = record.rfind(' ', comma);
+    const std::size_t rest = last_blank == std::string_view::npos ? 0 : last_blank + 1;
+    // "%-10s%s,%s": the key, upper-cased and padded to ten places, the name, the fields.
+    std::string out;
+    out.reserve(std::max<std::size_t>(key.size(), 10) + id.size() + 1 + record.size() - rest);
+    for (const char c : key) out += c >= 'a' && c <= 'z' ? static_cast<char>(c - 32) : c;
+    if (key.size() < 10) out.append(10 - key.size(), ' ');
+    out.append(id);
+    out += ',';
+    out.append(record.substr(rest));
+    return out;
 }
 
 std::wstring UNeutralFileFormat::MakeUpperCaseString(const std::wstring& text) const {

@@ -43,9 +43,13 @@ class UNeutralFileFormat {
     int ExtractRecord(const std::wstring& line, std::wstring& record) const;
     /// The type of a row: 99 for a comment, the type of its key, or 0 for an unknown key.
     int GetRecordType(const std::wstring& line) const;
+    /// The same for a row in UTF-8.
+    int GetRecordTypeUtf8(std::string_view line) const;
 
     int FindRecordKey(int type, std::wstring& key) const;
     int FindRecordKey(const std::wstring& key, int& type) const;
+    /// The same for a key in UTF-8, already in upper case.
+    int FindRecordKeyUtf8(std::string_view key, int& type) const;
     int FindRecordField(int id, std::wstring& key) const;
     int FindRecordField(const std::wstring& key, int& id) const;
     /// The kind of edit control of a field: 1 whole number, 3 real number, 7 angle,
@@ -73,9 +77,13 @@ class UNeutralFileFormat {
     /// blank, then the fields separated by commas, blanks around "=" and "," removed.
     /// Values are not touched. A comment or an empty text is given back as it is.
     std::wstring FormatRecord(int type, const std::wstring& line) const;
+    /// The same for a record in UTF-8 whose key is ASCII.
+    std::string FormatRecordUtf8(std::string_view line) const;
     /// The record with `id` inserted as its first field: "%-10s%s,%s" of the key, `id`, and
     /// the text from the first field on. A record without a comma is given back unchanged.
     std::wstring ReformatRecord(const std::wstring& record, const std::wstring& id) const;
+    /// The same in UTF-8, for a record whose key is ASCII.
+    std::string ReformatRecordUtf8(std::string_view record, std::string_view id) const;
 
     std::wstring MakeUpperCaseString(const std::wstring& text) const;
     int GetStringCount(const std::wstring& text, wchar_t c) const;

@@ -59,7 +59,10 @@ int UNeditDatabase::PrepareList() {
         ErrorCode = 1;
         return 0;
     }
-    return PrepareRows(Rows->GetRows());
+    std::vector<std::wstring> rows;
+    rows.reserve(static_cast<std::size_t>(Rows->GetItemCount()));
+    for (int row = 0; row < Rows->GetItemCount(); ++row) rows.push_back(Rows->GetItemText(row));
+    return PrepareRows(rows);
 }
 
 int UNeditDatabase::PrepareList(const std::vector<std::wstring>& rows) {

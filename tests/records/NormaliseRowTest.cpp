@@ -3,6 +3,7 @@
 #include <string>
 
 #include "RecordFixture.h"
+#include "platform/text/WideText.h"
 #include "records/RecordText.h"
 
 namespace {
@@ -40,4 +41,38 @@ TEST_F(RowGate, NoRowHoldsMoreThan255Characters) {
     const std::wstring unknown = NormaliseRow(format, L"unknown" + std::wstring(260, L'z'));
     EXPECT_EQ(unknown.size(), 255u);
     EXPECT_EQ(unknown.substr(0, 9), L"# UNKNOWN");
+}
+
+namespace {
+
+class NormaliseRowUtf8Gate : public RecordFixture,
+                             public ::testing::WithParamInterface<const wchar_t*> {};
+
+}  // namespace
+
+INSTANTIATE_TEST_SUITE_P(Rows, NormaliseRowUtf8Gate,
+                         ::testing::Values(L"ss id=p1,ha=1.0000", L"  scale 1.0  ", L"stn,id=a",
+                                           L"#  note:  Keep", L"weather sunny", L"", L"   ",
+                                           L"\tSS  ID = P1 ,  HA=1 ,CO=  kb\t",
+                                           L"stn id=zürich,hi=1.5", L"xyz ID=Æ,E=1",
+                                           L"ss id=p"
+                                           L"\u00e9,co=caf\u00e9",
+                                           L"insht 1.55", L"unit ul=m , ua=s"));
+
+// The gate of UTF-8 text is the gate of wide text: ASCII rows pass byte by byte, others
+// through wide text, and both give the same row.
+TEST_P(NormaliseRowUtf8Gate, GivesTheRowOfTheWideGate) {
+    std::string row;
+    NormaliseRowUtf8(format, nedit::ToUtf8(GetParam()), row);
+    EXPECT_EQ(nedit::FromUtf8(row), NormaliseRow(format, GetParam()));
+}
+
+TEST_F(RowGate, AUtf8RowCutAt255CharactersIsCutAsTheWideOne) {
+    for (const std::wstring& text :
+         {L"ss id=" + std::wstring(248, L'p') + L" ,x", L"ss id=" + std::wstring(300, L'\u00e9'),
+          L"unknown" + std::wstring(247, L'z') + L" q"}) {
+        std::string row;
+        NormaliseRowUtf8(format, nedit::ToUtf8(text), row);
+        EXPECT_EQ(nedit::FromUtf8(row), NormaliseRow(format, text));
+    }
 }

@@ -27,6 +27,8 @@ TEST(RecordText, IdText) {
     EXPECT_EQ(GetIdText(L"BKB       ID=D,BRG=45.0000"), L"ID=D");
     EXPECT_EQ(GetIdText(L"STN       ID=P1"), L"ID=P1");
     EXPECT_EQ(GetIdText(L"STN"), L"");
+    EXPECT_EQ(GetIdTextUtf8("STN       ID=Ü1,HI=1.500"), "ID=Ü1");
+    EXPECT_EQ(GetIdTextUtf8("STN       ID=P1"), "ID=P1");
 }
 
 namespace {

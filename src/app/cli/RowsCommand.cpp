@@ -22,7 +22,7 @@ int Rows(const std::string& file) {
     }
     std::string out;
     for (int row = 0; row < session.list->GetItemCount(); ++row) {
-        out += nedit::ToUtf8(session.list->GetItemText(row));
+        out += session.list->GetRowUtf8(row);
         out += '\n';
         if (out.size() > (1 << 20)) {
             std::fwrite(out.data(), 1, out.size(), stdout);

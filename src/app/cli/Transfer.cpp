@@ -137,7 +137,11 @@ int TransferTarget::Deliver(const TransferOptions& options, const std::string& v
                     nedit::ToUtf8(Name).c_str(), list.GetItemCount());
         return exit_status::Ok;
     }
-    for (const std::wstring& row : list.GetRows()) std::printf("%s\n", nedit::ToUtf8(row).c_str());
+    for (int row = 0; row < list.GetItemCount(); ++row) {
+        const std::string_view text = list.GetRowUtf8(row);
+        std::fwrite(text.data(), 1, text.size(), stdout);
+        std::fputc('\n', stdout);
+    }
     return std::fflush(stdout) == 0 ? exit_status::Ok : exit_status::Failed;
 }
 

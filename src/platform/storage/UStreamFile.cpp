@@ -34,12 +34,20 @@ int UStreamFile::OpenStream(UStorage& storage, const std::wstring& name, unsigne
 
 int UStreamFile::ReadString(std::wstring& line) {
     line.clear();
+    std::string_view bytes;
+    if (!ReadLine(bytes)) return 0;
+    line = nedit::DecodeTextLine(bytes);
+    return 1;
+}
+
+int UStreamFile::ReadLine(std::string_view& bytes) {
+    bytes = {};
     if (!IsOpen() || position_ >= data_.size()) return 0;
     const std::size_t end = data_.find('\n', position_);
     const std::size_t stop = end == std::string::npos ? data_.size() : end;
     std::size_t length = stop - position_;
     if (length > 0 && data_[position_ + length - 1] == '\r') --length;
-    line = nedit::DecodeTextLine(std::string_view(data_).substr(position_, length));
+    bytes = std::string_view(data_).substr(position_, length);
     position_ = end == std::string::npos ? data_.size() : end + 1;
     return 1;
 }

@@ -10,6 +10,7 @@
 
 #include <cstddef>
 #include <string>
+#include <string_view>
 
 class UStorage;
 
@@ -29,6 +30,8 @@ class UStreamFile {
 
     /// The next line without its line end (LF or CR LF); 0 at the end of the stream.
     int ReadString(std::wstring& line);
+    /// The same line's bytes as they are stored, good until the stream changes.
+    int ReadLine(std::string_view& bytes);
     /// Writes `line` and a line feed at the current position.
     void WriteString(const std::wstring& line);
     /// Up to `count` bytes from the current position; gives how many were read.

@@ -9,33 +9,54 @@
 namespace nedit {
 namespace {
 
-// The longest prefix of the text, from its first non-blank, made of characters that can
-// belong to a number, narrowed to ASCII for the standard parsers.
+constexpr std::size_t kMaxNumberLength = 512;
+
+template <typename Char>
+bool IsNumberCharacter(Char c) {
+    return (c >= '0' && c <= '9') || c == '.' || c == '+' || c == '-' || c == 'e' || c == 'E';
+}
+
+// Where the number of a text starts, after its leading blanks, and where the characters that
+// can belong to a number end.
+template <typename Char>
+std::pair<std::size_t, std::size_t> NumberSpan(std::basic_string_view<Char> text) {
+    std::size_t start = 0;
+    while (start < text.size() && IsBlank(static_cast<wchar_t>(text[start]))) ++start;
+    std::size_t end = start;
+    while (end < text.size() && end - start < kMaxNumberLength && IsNumberCharacter(text[end]))
+        ++end;
+    return {start, end};
+}
+
+// The characters of the number, narrowed to ASCII for the standard parsers, which take no
+// leading '+'.
 std::string NumberPrefix(std::wstring_view text) {
-    std::size_t i = 0;
-    while (i < text.size() && IsBlank(text[i])) ++i;
+    const auto [start, end] = NumberSpan(text);
     std::string out;
-    for (; i < text.size() && out.size() < 512; ++i) {
-        const wchar_t c = text[i];
-        const bool numeric = (c >= L'0' && c <= L'9') || c == L'.' || c == L'+' || c == L'-' ||
-                             c == L'e' || c == L'E';
-        if (!numeric) break;
-        out += static_cast<char>(c);
-    }
-    // from_chars takes no leading '+'.
+    out.reserve(end - start);
+    for (std::size_t i = start; i < end; ++i) out += static_cast<char>(text[i]);
     if (!out.empty() && out[0] == '+') out.erase(0, 1);
     return out;
+}
+
+double DigitsToDouble(const char* first, const char* last) {
+    double value = 0.0;
+    const auto result = std::from_chars(first, last, value, std::chars_format::general);
+    if (result.ec != std::errc() || !std::isfinite(value)) return 0.0;
+    return value;
 }
 
 }  // namespace
 
 double TextToDouble(std::wstring_view text) {
     const std::string digits = NumberPrefix(text);
-    double value = 0.0;
-    const auto result = std::from_chars(digits.data(), digits.data() + digits.size(), value,
-                                        std::chars_format::general);
-    if (result.ec != std::errc() || !std::isfinite(value)) return 0.0;
-    return value;
+    return DigitsToDouble(digits.data(), digits.data() + digits.size());
+}
+
+double TextToDouble(std::string_view text) {
+    auto [start, end] = NumberSpan(text);
+    if (start < end && text[start] == '+') ++start;
+    return DigitsToDouble(text.data() + start, text.data() + end);
 }
 
 int TextToInt(std::wstring_view text) {

@@ -12,6 +12,8 @@ namespace nedit {
 /// text. A value that is not a finite double ("nan", "inf", "1e400") also gives 0, so no
 /// field can bring a NaN or an infinity into a computation.
 double TextToDouble(std::wstring_view text);
+/// The same on UTF-8 text.
+double TextToDouble(std::string_view text);
 
 /// The whole number at the start of `text`, after leading blanks, with an optional sign.
 /// Gives 0 when none starts the text; a value beyond the range of int is clamped to it.

@@ -41,7 +41,7 @@ long DecodeAt(std::string_view text, std::size_t i, int length) {
     return static_cast<long>(code);
 }
 
-void AppendUtf8(std::string& out, unsigned long code) {
+void AppendCodePoint(std::string& out, unsigned long code) {
     if (code > 0x10FFFF || (code >= 0xD800 && code <= 0xDFFF)) code = kReplacement;
     if (code < 0x80) {
         out += static_cast<char>(code);
@@ -120,9 +120,38 @@ std::wstring FromUtf8(std::string_view utf8) {
     return out;
 }
 
+void FromUtf8(std::string_view utf8, std::wstring& out) {
+    Decode(utf8, out, false);
+}
+
 bool IsValidUtf8(std::string_view bytes) {
-    std::wstring ignored;
-    return Decode(bytes, ignored, true);
+    for (std::size_t i = 0; i < bytes.size();) {
+        const auto lead = static_cast<unsigned char>(bytes[i]);
+        if (lead < 0x80) {
+            ++i;
+            continue;
+        }
+        const int length = SequenceLength(lead);
+        if (length == 0 || DecodeAt(bytes, i, length) < 0) return false;
+        i += static_cast<std::size_t>(length);
+    }
+    return true;
+}
+
+std::string_view TextLineAsUtf8(std::string_view bytes, std::string& buffer) {
+    if (IsValidUtf8(bytes)) return bytes;
+    buffer.clear();
+    for (const char byte : bytes) AppendCodePoint(buffer, static_cast<unsigned char>(byte));
+    return buffer;
+}
+
+std::string ToUpperUtf8(std::string_view text) {
+    if (!IsAscii(text)) return ToUtf8(ToUpper(FromUtf8(text)));
+    std::string out(text);
+    for (char& c : out) {
+        if (c >= 'a' && c <= 'z') c = static_cast<char>(c - 32);
+    }
+    return out;
 }
 
 std::wstring DecodeTextLine(std::string_view bytes) {
@@ -136,14 +165,23 @@ std::wstring DecodeTextLine(std::string_view bytes) {
 std::string ToUtf8(std::wstring_view text) {
     std::string out;
     out.reserve(text.size());
+    AppendUtf8(out, text);
+    return out;
+}
+
+void AppendUtf8(std::string& out, std::wstring_view text) {
     for (wchar_t c : text) {
         if (c >= 0 && c < 0x80) {
             out += static_cast<char>(c);
         } else {
-            AppendUtf8(out, static_cast<unsigned long>(c));
+            AppendCodePoint(out, static_cast<unsigned long>(c));
         }
     }
-    return out;
+}
+
+bool IsAscii(std::string_view bytes) {
+    return std::all_of(bytes.begin(), bytes.end(),
+                       [](char c) { return static_cast<unsigned char>(c) < 0x80; });
 }
 
 std::wstring ToUpper(std::wstring_view text) {
@@ -189,6 +227,22 @@ std::wstring_view TrimRightView(std::wstring_view text) {
 }
 
 std::wstring_view TrimView(std::wstring_view text) {
+    return TrimRightView(TrimLeftView(text));
+}
+
+std::string_view TrimLeftView(std::string_view text) {
+    std::size_t start = 0;
+    while (start < text.size() && IsBlank(static_cast<unsigned char>(text[start]))) ++start;
+    return text.substr(start);
+}
+
+std::string_view TrimRightView(std::string_view text) {
+    std::size_t end = text.size();
+    while (end > 0 && IsBlank(static_cast<unsigned char>(text[end - 1]))) --end;
+    return text.substr(0, end);
+}
+
+std::string_view TrimView(std::string_view text) {
     return TrimRightView(TrimLeftView(text));
 }
 

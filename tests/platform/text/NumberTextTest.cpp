@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 
 #include <climits>
+#include <string>
 
 #include "platform/text/NumberText.h"
 
@@ -29,6 +30,9 @@ INSTANTIATE_TEST_SUITE_P(Texts, TextToDoubleReads,
 
 TEST_P(TextToDoubleReads, TheLeadingNumberOrGivesZero) {
     EXPECT_DOUBLE_EQ(TextToDouble(GetParam().text), GetParam().expected);
+    // UTF-8 text reads alike.
+    const std::wstring_view wide = GetParam().text;
+    EXPECT_DOUBLE_EQ(TextToDouble(std::string(wide.begin(), wide.end())), GetParam().expected);
 }
 
 TEST(NumberText, TextToIntReadsTheLeadingWholeNumber) {
