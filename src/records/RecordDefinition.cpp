@@ -77,7 +77,7 @@ bool RecordDefinitionTable::ParseLine(const std::vector<std::wstring>& words, st
             error = L"expected SINGLE type key kind [field-id]";
             return false;
         }
-        AddField({record.type, record.key, record.single_kind});
+        AddField({record.type, record.key, record.single_kind, 0});
     } else {
         for (std::size_t i = 3; i < words.size(); ++i) {
             int id = 0;
@@ -95,6 +95,8 @@ bool RecordDefinitionTable::ParseLine(const std::vector<std::wstring>& words, st
 }
 
 void RecordDefinitionTable::AddField(FieldDefinition field) {
+    const auto known = fields_.find(field.id);
+    field.slot = known != fields_.end() ? known->second.slot : static_cast<int>(fields_.size());
     field_ids_by_key_[field.key] = field.id;
     field_ids_by_utf8_key_[nedit::ToUtf8(field.key)] = field.id;
     fields_[field.id] = std::move(field);

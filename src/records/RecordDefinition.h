@@ -14,6 +14,9 @@ struct FieldDefinition {
     int id = 0;
     std::wstring key;
     FieldKind kind = FieldKind::Text;
+    /// The field's place among all fields, from 0 up to FieldCount(): where its current
+    /// value is kept.
+    int slot = 0;
 };
 
 struct RecordDefinition {
@@ -46,6 +49,7 @@ class RecordDefinitionTable {
     const FieldDefinition* FieldById(int id) const;
     const FieldDefinition* FieldByKey(const std::wstring& key) const;
     const FieldDefinition* FieldByKeyUtf8(std::string_view key) const;
+    std::size_t FieldCount() const { return fields_.size(); }
 
   private:
     bool ParseLine(const std::vector<std::wstring>& words, std::wstring& error);

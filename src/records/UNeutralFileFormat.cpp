@@ -93,12 +93,23 @@ UNeutralFileFormat::UNeutralFileFormat(const UJobSettings* settings) : settings_
 UNeutralFileFormat::~UNeutralFileFormat() = default;
 
 void UNeutralFileFormat::InitMaps() {
-    current_values_.clear();
+    ResetCurrentValues();
 }
 
 void UNeutralFileFormat::ClearMaps() {
     definition_.Clear();
-    current_values_.clear();
+    StartCurrentValues();
+}
+
+void UNeutralFileFormat::StartCurrentValues() {
+    current_.assign(definition_.FieldCount(), CurrentValue());
+    other_current_.clear();
+    // Field ids are small numbers; their slots are found by index, not by a hash.
+    constexpr int kIndexedIds = 1024;
+    slot_of_id_.assign(kIndexedIds, -1);
+    for (int id = 0; id < kIndexedIds; ++id) {
+        if (const FieldDefinition* field = definition_.FieldById(id)) slot_of_id_[id] = field->slot;
+    }
 }
 
 bool UNeutralFileFormat::LoadNeutralFileDefinition(const std::wstring& dir) {
@@ -117,7 +128,9 @@ bool UNeutralFileFormat::LoadNeutralFileDefinition(const std::wstring& dir) {
 
 bool UNeutralFileFormat::LoadDefinitionText(const std::wstring& text) {
     definition_error_.clear();
-    return definition_.Parse(text, definition_error_);
+    const bool loaded = definition_.Parse(text, definition_error_);
+    StartCurrentValues();
+    return loaded;
 }
 
 bool UNeutralFileFormat::IsFileHeader(const std::wstring& line) const {
@@ -229,57 +242,100 @@ bool UNeutralFileFormat::GetRecordTemplate(int type, std::wstring& text) const {
     return true;
 }
 
-int UNeutralFileFormat::ProcessRecord(int type, const std::wstring& line, FieldMap& fields) {
-    fields.clear();
+template <typename Char, typename Store>
+int UNeutralFileFormat::WalkFields(int type, std::basic_string_view<Char> line, Store store) {
+    using View = std::basic_string_view<Char>;
     const RecordDefinition* record = definition_.RecordByType(type);
     if (record == nullptr || (!record->single_field && record->fields.empty())) return 0;
-    const std::wstring_view text = nedit::TrimView(line);
-    const std::size_t key_end = std::min(text.find_first_of(L" ,"), text.size());
-    const std::wstring_view body = nedit::TrimView(text.substr(key_end));
+    const View text = nedit::TrimView(line);
+    const View body = nedit::TrimView(text.substr(KeyEnd(text)));
     if (record->single_field) {
-        StoreField(record->type, record->single_kind, body, fields);
+        store(record->type, record->single_kind, body);
         return 1;
     }
     std::size_t position = 0;
     for (std::size_t start = 0; start <= body.size(); ++position) {
-        const std::size_t comma = std::min(body.find(L',', start), body.size());
-        const std::wstring_view token = nedit::TrimView(body.substr(start, comma - start));
+        const std::size_t comma = std::min(body.find(Char(','), start), body.size());
+        const View token = nedit::TrimView(body.substr(start, comma - start));
         start = comma + 1;
-        const std::size_t equals = token.find(L'=');
+        const std::size_t equals = token.find(Char('='));
         const FieldDefinition* field = nullptr;
-        std::wstring_view value = token;
-        if (equals != std::wstring_view::npos) {
+        View value = token;
+        if (equals != View::npos) {
             // A key that the definition does not know is passed over, not guessed at.
-            field =
-                definition_.FieldByKey(nedit::ToUpper(nedit::TrimView(token.substr(0, equals))));
+            field = FieldOfKey(nedit::TrimView(token.substr(0, equals)));
             value = nedit::TrimView(token.substr(equals + 1));
         } else if (position < record->fields.size() && !token.empty()) {
             field = definition_.FieldById(record->fields[position]);
         }
-        if (field != nullptr) StoreField(field->id, field->kind, value, fields);
+        if (field != nullptr) store(field->id, field->kind, value);
     }
     return 1;
+}
+
+const FieldDefinition* UNeutralFileFormat::FieldOfKey(std::wstring_view key) const {
+    return definition_.FieldByKey(nedit::ToUpper(key));
+}
+
+const FieldDefinition* UNeutralFileFormat::FieldOfKey(std::string_view key) const {
+    char upper[64];
+    if (!nedit::IsAscii(key) || key.size() > sizeof upper)
+        return definition_.FieldByKey(nedit::ToUpper(nedit::FromUtf8(key)));
+    for (std::size_t i = 0; i < key.size(); ++i)
+        upper[i] = key[i] >= 'a' && key[i] <= 'z' ? static_cast<char>(key[i] - 32) : key[i];
+    return definition_.FieldByKeyUtf8({upper, key.size()});
+}
+
+int UNeutralFileFormat::ProcessRecord(int type, const std::wstring& line, FieldMap& fields) {
+    fields.clear();
+    return WalkFields(type, std::wstring_view(line),
+                      [&](int id, FieldKind kind, std::wstring_view value) {
+                          StoreField(id, kind, value, fields);
+                      });
+}
+
+int UNeutralFileFormat::ReadRecord(int type, std::string_view line, RecordFields& fields) {
+    fields.clear();
+    return WalkFields(type, line, [&](int id, FieldKind kind, std::string_view value) {
+        StoreField(id, kind, value, fields);
+    });
 }
 
 void UNeutralFileFormat::StoreField(int id, FieldKind kind, std::wstring_view text,
                                     FieldMap& fields) {
     std::wstring& value = fields[id];
     ReadValue(kind, text, value);
-    if (!value.empty()) current_values_[id] = value;
+    if (!value.empty()) SetCurrentValue(id, value);
+}
+
+void UNeutralFileFormat::StoreField(int id, FieldKind kind, std::string_view text,
+                                    RecordFields& fields) {
+    RecordValue& value = fields[id];
+    value = RecordValue();
+    if (Converts(kind, text.empty())) {
+        value.converted = true;
+        value.number = Converted(kind, nedit::TextToDouble(text));
+    } else {
+        value.text = text;
+    }
+    if (!value.empty()) SetCurrentValue(id, value);
+}
+
+bool UNeutralFileFormat::Converts(FieldKind kind, bool empty) const {
+    return !empty && ((kind == FieldKind::Angle && FileAngleUnit() != nedit::AngleUnit::Degrees) ||
+                      (kind == FieldKind::Length && FileLengthUnit() != WorkingLengthUnit()));
+}
+
+double UNeutralFileFormat::Converted(FieldKind kind, double value) const {
+    return kind == FieldKind::Angle ? ConvertAngle(value) : ConvertDist(value, false);
 }
 
 void UNeutralFileFormat::ReadValue(FieldKind kind, std::wstring_view text,
                                    std::wstring& value) const {
-    const bool converted =
-        !text.empty() &&
-        ((kind == FieldKind::Angle && FileAngleUnit() != nedit::AngleUnit::Degrees) ||
-         (kind == FieldKind::Length && FileLengthUnit() != WorkingLengthUnit()));
-    if (!converted) {
-        value.assign(text);
-    } else if (kind == FieldKind::Angle) {
-        value = nedit::DoubleToText(ConvertAngle(nedit::TextToDouble(text)));
+    if (Converts(kind, text.empty())) {
+        value = nedit::DoubleToText(Converted(kind, nedit::TextToDouble(text)));
     } else {
-        value = nedit::DoubleToText(ConvertDist(nedit::TextToDouble(text), false));
+        value.assign(text);
     }
 }
 
@@ -329,18 +385,73 @@ int UNeutralFileFormat::GetStringCount(const std::wstring& text, wchar_t c) cons
     return nedit::CountOf(text, c);
 }
 
+UNeutralFileFormat::CurrentValue* UNeutralFileFormat::CurrentOf(int id) {
+    const int slot = id >= 0 && static_cast<std::size_t>(id) < slot_of_id_.size()
+                         ? slot_of_id_[static_cast<std::size_t>(id)]
+                     : definition_.FieldById(id) != nullptr ? definition_.FieldById(id)->slot
+                                                            : -1;
+    if (slot >= 0 && static_cast<std::size_t>(slot) < current_.size())
+        return &current_[static_cast<std::size_t>(slot)];
+    return &other_current_[id];
+}
+
+const UNeutralFileFormat::CurrentValue* UNeutralFileFormat::CurrentOf(int id) const {
+    const int slot = id >= 0 && static_cast<std::size_t>(id) < slot_of_id_.size()
+                         ? slot_of_id_[static_cast<std::size_t>(id)]
+                     : definition_.FieldById(id) != nullptr ? definition_.FieldById(id)->slot
+                                                            : -1;
+    if (slot >= 0 && static_cast<std::size_t>(slot) < current_.size())
+        return &current_[static_cast<std::size_t>(slot)];
+    const auto found = other_current_.find(id);
+    return found == other_current_.end() ? nullptr : &found->second;
+}
+
 const std::wstring& UNeutralFileFormat::GetCurrentValue(int id) const {
     static const std::wstring kNone;
-    const auto found = current_values_.find(id);
-    return found == current_values_.end() ? kNone : found->second;
+    const CurrentValue* current = CurrentOf(id);
+    if (current == nullptr) return kNone;
+    if (!current->wide_made) {
+        current->wide = current->converted ? nedit::DoubleToText(current->number)
+                                           : nedit::FromUtf8(current->text);
+        current->wide_made = true;
+    }
+    return current->wide;
 }
 
 void UNeutralFileFormat::SetCurrentValue(int id, const std::wstring& value) {
-    current_values_[id] = value;
+    CurrentValue* current = CurrentOf(id);
+    current->text.clear();
+    nedit::AppendUtf8(current->text, value);
+    current->converted = false;
+    current->wide = value;
+    current->wide_made = true;
+}
+
+RecordValue UNeutralFileFormat::CurrentValueOf(int id) const {
+    RecordValue value;
+    if (const CurrentValue* current = CurrentOf(id)) {
+        value.text = current->text;
+        value.number = current->number;
+        value.converted = current->converted;
+    }
+    return value;
+}
+
+void UNeutralFileFormat::SetCurrentValue(int id, const RecordValue& value) {
+    CurrentValue* current = CurrentOf(id);
+    current->text.assign(value.text);
+    current->number = value.number;
+    current->converted = value.converted;
+    current->wide_made = false;
 }
 
 void UNeutralFileFormat::ResetCurrentValues() {
-    current_values_.clear();
+    for (CurrentValue& current : current_) {
+        current.text.clear();
+        current.converted = false;
+        current.wide_made = false;
+    }
+    other_current_.clear();
 }
 
 void UNeutralFileFormat::InitUnitsAndAngleModes(wchar_t& angle, wchar_t& length, wchar_t& hmode,
@@ -392,7 +503,11 @@ nedit::AngleUnit UNeutralFileFormat::FileAngleUnit() const {
 }
 
 wchar_t UNeutralFileFormat::CurrentLetter(int id, wchar_t fallback) const {
-    const auto found = current_values_.find(id);
-    if (found == current_values_.end() || found->second.empty()) return fallback;
-    return nedit::ToUpper(found->second.substr(0, 1))[0];
+    const CurrentValue* current = CurrentOf(id);
+    if (current == nullptr || (!current->converted && current->text.empty())) return fallback;
+    if (!current->converted && static_cast<unsigned char>(current->text[0]) < 0x80) {
+        const char first = current->text[0];
+        return first >= 'a' && first <= 'z' ? static_cast<wchar_t>(first - 32) : first;
+    }
+    return nedit::ToUpper(GetCurrentValue(id).substr(0, 1))[0];
 }

@@ -10,11 +10,14 @@
 // Values handed out are in working units: lengths in the job's unit, angles in degrees.
 
 #include <string>
+#include <string_view>
 #include <unordered_map>
+#include <vector>
 
 #include "platform/job/UJobSettings.h"
 #include "records/FieldMap.h"
 #include "records/RecordDefinition.h"
+#include "records/RecordFields.h"
 
 class UNeutralFileFormat {
   public:
@@ -68,6 +71,10 @@ class UNeutralFileFormat {
     /// single-field record keeps its value under its own type number.
     /// Gives 0, with `fields` empty, for an unknown type or a type without fields.
     int ProcessRecord(int type, const std::wstring& line, FieldMap& fields);
+    /// The same from a row in UTF-8, its values as views into `line` (which must outlive
+    /// them) or as numbers in working units; what the values read as, and the current values
+    /// it leaves, are those of ProcessRecord.
+    int ReadRecord(int type, std::string_view line, RecordFields& fields);
 
     /// The template of a record type: its field keys, each with "=", joined by commas
     /// ("ID=,HI=,CO=" for a station); empty for a single-field record. False for an unknown type.
@@ -92,6 +99,9 @@ class UNeutralFileFormat {
     const std::wstring& GetCurrentValue(int id) const;
     void SetCurrentValue(int id, const std::wstring& value);
     void ResetCurrentValues();
+    /// The current value as ReadRecord gives values, good until the next parse.
+    RecordValue CurrentValueOf(int id) const;
+    void SetCurrentValue(int id, const RecordValue& value);
 
     /// The job's angle and length letters, and the start modes "A" and "Z".
     void InitUnitsAndAngleModes(wchar_t& angle, wchar_t& length, wchar_t& hmode,
@@ -116,16 +126,41 @@ class UNeutralFileFormat {
     wchar_t GetVModeLetter() const { return CurrentLetter(820, L'Z'); }
 
   private:
+    /// The current value of one field: its text in UTF-8 as it came, or, for a value read in
+    /// other units, the number it became. Its wide text is made when it is asked for.
+    struct CurrentValue {
+        std::string text;
+        double number = 0.0;
+        bool converted = false;
+        mutable std::wstring wide;
+        mutable bool wide_made = false;
+    };
+
     nedit::LengthUnit WorkingLengthUnit() const;
     nedit::LengthUnit FileLengthUnit() const;
     nedit::AngleUnit FileAngleUnit() const;
     wchar_t CurrentLetter(int id, wchar_t fallback) const;
+    /// Whether a value of `kind` written as `text` is read in other units, and the number it
+    /// then becomes.
+    bool Converts(FieldKind kind, bool empty) const;
+    double Converted(FieldKind kind, double value) const;
     /// A value text read in the file's units, written into `value` in working units.
     void ReadValue(FieldKind kind, std::wstring_view text, std::wstring& value) const;
     void StoreField(int id, FieldKind kind, std::wstring_view text, FieldMap& fields);
+    void StoreField(int id, FieldKind kind, std::string_view text, RecordFields& fields);
+    /// Gives each field of a record's text, with its value text, to `store`.
+    template <typename Char, typename Store>
+    int WalkFields(int type, std::basic_string_view<Char> line, Store store);
+    const FieldDefinition* FieldOfKey(std::wstring_view key) const;
+    const FieldDefinition* FieldOfKey(std::string_view key) const;
+    CurrentValue* CurrentOf(int id);
+    const CurrentValue* CurrentOf(int id) const;
+    void StartCurrentValues();
 
     const UJobSettings* settings_;
     RecordDefinitionTable definition_;
     std::wstring definition_error_;
-    std::unordered_map<int, std::wstring> current_values_;
+    std::vector<CurrentValue> current_;                    // by the slot of the field
+    std::unordered_map<int, CurrentValue> other_current_;  // ids that the definition lacks
+    std::vector<int> slot_of_id_;                          // -1 for an id without a field
 };
