@@ -20,9 +20,8 @@ int UListCtrl::AddRecord(int row, const std::wstring& text) {
 }
 
 int UListCtrl::AddRecordUtf8(int row, std::string_view text) {
-    std::string normalised;
-    NormaliseRowUtf8(*format_, text, normalised);
-    return InsertRecord(row, normalised);
+    NormaliseRowUtf8(*format_, text, gate_);
+    return InsertRecord(row, gate_);
 }
 
 int UListCtrl::InsertRecord(int row, std::string_view normalised) {

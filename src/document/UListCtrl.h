@@ -259,6 +259,7 @@ class UListCtrl : public nedit::RowSource {
 
     const UNeutralFileFormat* format_;
     nedit::TextLines rows_;  // UTF-8
+    std::string gate_;       // the row that passed the gate last
     mutable std::vector<std::wstring> wide_rows_;
     mutable std::uint64_t wide_rows_revision_ = ~std::uint64_t{0};
     std::vector<char> selected_;  // beside rows_, one flag per row

@@ -93,8 +93,9 @@ int UNeditDoc::Load(UListCtrl* list) {
             line = upper;
         }
         first = false;
-        coordinates.CompleteUtf8(*this, GetRecordTypeUtf8(line), line, completed);
-        const int row = list->AddRecordUtf8(list->GetItemCount(), completed);
+        const int row = list->AddRecordUtf8(
+            list->GetItemCount(),
+            coordinates.CompleteUtf8(*this, GetRecordTypeUtf8(line), line, completed));
         if (row >= 0 && keep_text) {
             NeuText += list->GetRowUtf8(row);
             NeuText += '\n';

@@ -18,18 +18,17 @@ std::wstring NamelessCoordinates::Complete(const UNeutralFileFormat& format, int
     return row;
 }
 
-void NamelessCoordinates::CompleteUtf8(const UNeutralFileFormat& format, int type,
-                                       std::string_view row, std::string& out) {
+std::string_view NamelessCoordinates::CompleteUtf8(const UNeutralFileFormat& format, int type,
+                                                   std::string_view row, std::string& buffer) {
     if (type == rec::Stn || type == rec::Bkb) {
         IdTextUtf8 = GetIdTextUtf8(row);
         IdText = nedit::FromUtf8(IdTextUtf8);
     }
-    const bool nameless = type == rec::Xyz && std::count(row.begin(), row.end(), ',') <= 2;
-    if (!nameless) {
-        out.assign(row);
-    } else if (nedit::IsAscii(row.substr(0, row.find(' ')))) {
-        out = format.ReformatRecordUtf8(row, IdTextUtf8);
+    if (type != rec::Xyz || std::count(row.begin(), row.end(), ',') > 2) return row;
+    if (nedit::IsAscii(row.substr(0, row.find(' ')))) {
+        buffer = format.ReformatRecordUtf8(row, IdTextUtf8);
     } else {
-        out = nedit::ToUtf8(format.ReformatRecord(nedit::FromUtf8(row), IdText));
+        buffer = nedit::ToUtf8(format.ReformatRecord(nedit::FromUtf8(row), IdText));
     }
+    return buffer;
 }

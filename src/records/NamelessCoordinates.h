@@ -14,9 +14,9 @@ class NamelessCoordinates {
     /// ID field of the last station or back-bearing record before it (an empty one before
     /// any), other rows stay as they are.
     std::wstring Complete(const UNeutralFileFormat& format, int type, const std::wstring& row);
-    /// The same for a row in UTF-8, into `out`.
-    void CompleteUtf8(const UNeutralFileFormat& format, int type, std::string_view row,
-                      std::string& out);
+    /// The same for a row in UTF-8: `row` itself, or the completed row made in `buffer`.
+    std::string_view CompleteUtf8(const UNeutralFileFormat& format, int type, std::string_view row,
+                                  std::string& buffer);
 
   private:
     std::wstring IdText;

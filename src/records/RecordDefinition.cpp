@@ -1,5 +1,6 @@
 #include "records/RecordDefinition.h"
 
+#include <algorithm>
 #include <sstream>
 
 #include "platform/text/NumberText.h"
@@ -89,7 +90,7 @@ bool RecordDefinitionTable::ParseLine(const std::vector<std::wstring>& words, st
         }
     }
     record_types_by_key_[record.key] = record.type;
-    record_types_by_utf8_key_[nedit::ToUtf8(record.key)] = record.type;
+    record_types_by_utf8_key_.Set(nedit::ToUtf8(record.key), record.type);
     records_[record.type] = std::move(record);
     return true;
 }
@@ -98,17 +99,17 @@ void RecordDefinitionTable::AddField(FieldDefinition field) {
     const auto known = fields_.find(field.id);
     field.slot = known != fields_.end() ? known->second.slot : static_cast<int>(fields_.size());
     field_ids_by_key_[field.key] = field.id;
-    field_ids_by_utf8_key_[nedit::ToUtf8(field.key)] = field.id;
+    field_ids_by_utf8_key_.Set(nedit::ToUtf8(field.key), field.id);
     fields_[field.id] = std::move(field);
 }
 
 void RecordDefinitionTable::Clear() {
     records_.clear();
     record_types_by_key_.clear();
-    record_types_by_utf8_key_.clear();
+    record_types_by_utf8_key_.Clear();
     fields_.clear();
     field_ids_by_key_.clear();
-    field_ids_by_utf8_key_.clear();
+    field_ids_by_utf8_key_.Clear();
 }
 
 const RecordDefinition* RecordDefinitionTable::RecordByType(int type) const {
@@ -122,8 +123,8 @@ const RecordDefinition* RecordDefinitionTable::RecordByKey(const std::wstring& k
 }
 
 const RecordDefinition* RecordDefinitionTable::RecordByKeyUtf8(std::string_view key) const {
-    const auto found = record_types_by_utf8_key_.find(std::string(key));
-    return found == record_types_by_utf8_key_.end() ? nullptr : RecordByType(found->second);
+    const int type = record_types_by_utf8_key_.Find(key);
+    return type < 0 ? nullptr : RecordByType(type);
 }
 
 const FieldDefinition* RecordDefinitionTable::FieldById(int id) const {
@@ -137,6 +138,52 @@ const FieldDefinition* RecordDefinitionTable::FieldByKey(const std::wstring& key
 }
 
 const FieldDefinition* RecordDefinitionTable::FieldByKeyUtf8(std::string_view key) const {
-    const auto found = field_ids_by_utf8_key_.find(std::string(key));
-    return found == field_ids_by_utf8_key_.end() ? nullptr : FieldById(found->second);
+    const int id = field_ids_by_utf8_key_.Find(key);
+    return id < 0 ? nullptr : FieldById(id);
+}
+
+namespace {
+
+std::size_t HashOfKey(std::string_view key) {
+    std::size_t hash = 14695981039346656037ull;  // FNV-1a
+    for (const char c : key) hash = (hash ^ static_cast<unsigned char>(c)) * 1099511628211ull;
+    return hash;
+}
+
+}  // namespace
+
+void RecordDefinitionTable::Utf8Keys::Set(const std::string& key, int value) {
+    if (4 * (used_ + 1) > slots_.size()) {
+        std::vector<Slot> old = std::move(slots_);
+        slots_.assign(std::max<std::size_t>(64, 2 * old.size()), Slot());
+        used_ = 0;
+        for (const Slot& slot : old) {
+            if (slot.value >= 0) Set(slot.key, slot.value);
+        }
+    }
+    const std::size_t mask = slots_.size() - 1;
+    for (std::size_t i = HashOfKey(key) & mask;; i = (i + 1) & mask) {
+        Slot& slot = slots_[i];
+        if (slot.value < 0 || slot.key == key) {
+            if (slot.value < 0) ++used_;
+            slot.key = key;
+            slot.value = value;
+            return;
+        }
+    }
+}
+
+int RecordDefinitionTable::Utf8Keys::Find(std::string_view key) const {
+    if (slots_.empty()) return -1;
+    const std::size_t mask = slots_.size() - 1;
+    for (std::size_t i = HashOfKey(key) & mask;; i = (i + 1) & mask) {
+        const Slot& slot = slots_[i];
+        if (slot.value < 0) return -1;
+        if (slot.key == key) return slot.value;
+    }
+}
+
+void RecordDefinitionTable::Utf8Keys::Clear() {
+    slots_.clear();
+    used_ = 0;
 }

@@ -44,6 +44,10 @@ class RecordDefinitionTable {
     const RecordDefinition* RecordByKey(const std::wstring& key) const;
     /// The same for a key in UTF-8.
     const RecordDefinition* RecordByKeyUtf8(std::string_view key) const;
+    /// The type of a key in UTF-8, or -1.
+    int RecordTypeByKeyUtf8(std::string_view key) const {
+        return record_types_by_utf8_key_.Find(key);
+    }
     /// Fields by id and by key. The key of a single-field record is also a field key, with
     /// the record's type as its id, so that its one value can be named.
     const FieldDefinition* FieldById(int id) const;
@@ -52,13 +56,31 @@ class RecordDefinitionTable {
     std::size_t FieldCount() const { return fields_.size(); }
 
   private:
+    /// Short UTF-8 keys to numbers, found by one hash of the key's bytes: every row read
+    /// looks its key up, so no string is made for the look-up.
+    class Utf8Keys {
+      public:
+        void Set(const std::string& key, int value);
+        /// The number of `key`, or -1.
+        int Find(std::string_view key) const;
+        void Clear();
+
+      private:
+        struct Slot {
+            std::string key;
+            int value = -1;
+        };
+        std::vector<Slot> slots_;  // a power of two in size, at most a quarter full
+        std::size_t used_ = 0;
+    };
+
     bool ParseLine(const std::vector<std::wstring>& words, std::wstring& error);
     void AddField(FieldDefinition field);
 
     std::unordered_map<int, RecordDefinition> records_;
     std::unordered_map<std::wstring, int> record_types_by_key_;
-    std::unordered_map<std::string, int> record_types_by_utf8_key_;
+    Utf8Keys record_types_by_utf8_key_;
     std::unordered_map<int, FieldDefinition> fields_;
     std::unordered_map<std::wstring, int> field_ids_by_key_;
-    std::unordered_map<std::string, int> field_ids_by_utf8_key_;
+    Utf8Keys field_ids_by_utf8_key_;
 };

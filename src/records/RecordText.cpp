@@ -1,6 +1,9 @@
 #include "records/RecordText.h"
 
+#include <algorithm>
+
 #include "platform/text/WideText.h"
+#include "records/RecordLayout.h"
 #include "records/RecordTypes.h"
 #include "records/UNeutralFileFormat.h"
 
@@ -121,20 +124,27 @@ void NormaliseRowUtf8(const UNeutralFileFormat& format, std::string_view text, s
         out = nedit::ToUtf8(NormaliseRow(format, nedit::FromUtf8(text)));
         return;
     }
-    const std::string_view trimmed = nedit::TrimView(text);
-    std::string row(trimmed);
-    for (char& c : row) {
-        if (c >= 'a' && c <= 'z') c = static_cast<char>(c - 32);
-    }
+    // ASCII rows are upper-cased as they are laid out, in one pass.
+    const auto upper = [](char c) {
+        return static_cast<char>(c - (c >= 'a' && c <= 'z' ? 32 : 0));
+    };
+    const std::string_view row = nedit::layout::Trim(text);
+    out.clear();
     if (!row.empty() && row[0] != '#') {
+        const std::string_view key = row.substr(0, nedit::layout::KeyEnd(row));
+        char upper_key[64];
+        std::size_t length = std::min(key.size(), sizeof upper_key);
+        for (std::size_t i = 0; i < length; ++i) upper_key[i] = upper(key[i]);
+        // A key longer than the buffer is longer than any key of a definition.
         int type = rec::None;
-        if (format.FindRecordKeyUtf8(std::string_view(row).substr(0, row.find_first_of(" ,")),
-                                     type)) {
-            row = format.FormatRecordUtf8(row);
+        if (key.size() <= sizeof upper_key && format.FindRecordKeyUtf8({upper_key, length}, type)) {
+            nedit::layout::LayOut(row, out, upper);
         } else {
-            row.insert(0, "# ");
+            out = "# ";
+            nedit::layout::Append(out, row, upper);
         }
+    } else {
+        nedit::layout::Append(out, row, upper);
     }
-    if (row.size() > static_cast<std::size_t>(kMaxRowLength)) row.resize(kMaxRowLength);
-    out = std::move(row);
+    if (out.size() > static_cast<std::size_t>(kMaxRowLength)) out.resize(kMaxRowLength);
 }

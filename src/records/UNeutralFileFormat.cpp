@@ -7,6 +7,7 @@
 #include "platform/text/Format.h"
 #include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
+#include "records/RecordLayout.h"
 #include "records/RecordTypes.h"
 
 namespace {
@@ -22,55 +23,7 @@ std::wstring KeyOf(std::wstring_view text) {
     return nedit::ToUpper(text.substr(0, std::min(text.find_first_of(L" ,"), text.size())));
 }
 
-// Where the key of a record ends: at its first blank or comma, or at its end.
-template <typename Char>
-std::size_t KeyEnd(std::basic_string_view<Char> text) {
-    for (std::size_t i = 0; i < text.size(); ++i) {
-        if (text[i] == ' ' || text[i] == ',') return i;
-    }
-    return text.size();
-}
-
-// The standard layout of a record: the key padded to nine places and a blank ("%-9s %s"),
-// then the fields separated by commas, blanks around "=" and "," removed. The key is counted
-// in characters, so UTF-8 text must have an ASCII key.
-template <typename Char>
-std::basic_string<Char> LayOutRecord(std::basic_string_view<Char> line) {
-    using View = std::basic_string_view<Char>;
-    const View text = nedit::TrimView(line);
-    if (text.empty() || text[0] == '#') return std::basic_string<Char>(text);
-    const std::size_t key_end = KeyEnd(text);
-    const View key = text.substr(0, key_end);
-    const View body = nedit::TrimView(text.substr(key_end));
-
-    std::basic_string<Char> out;
-    out.reserve(std::max<std::size_t>(key.size(), 9) + 1 + body.size());
-    out.append(key);
-    if (key.size() < 9) out.append(9 - key.size(), ' ');
-    out += ' ';
-    const bool has_fields =
-        std::any_of(body.begin(), body.end(), [](Char c) { return c == ',' || c == '='; });
-    if (!has_fields) {
-        out.append(body);
-    } else {
-        for (std::size_t start = 0; start <= body.size();) {
-            const std::size_t comma = std::min(body.find(Char(','), start), body.size());
-            const View token = nedit::TrimView(body.substr(start, comma - start));
-            if (start > 0) out += ',';
-            const std::size_t equals = token.find(Char('='));
-            if (equals == View::npos) {
-                out.append(token);
-            } else {
-                out.append(nedit::TrimRightView(token.substr(0, equals)));
-                out += '=';
-                out.append(nedit::TrimLeftView(token.substr(equals + 1)));
-            }
-            start = comma + 1;
-        }
-    }
-    out.resize(nedit::TrimRightView(View(out)).size());
-    return out;
-}
+using nedit::layout::KeyEnd;
 
 int WinTypeOf(FieldKind kind) {
     switch (kind) {
@@ -85,6 +38,14 @@ int WinTypeOf(FieldKind kind) {
             return 6;
     }
 }
+
+// Characters as they are.
+struct Unchanged {
+    template <typename Char>
+    Char operator()(Char c) const {
+        return c;
+    }
+};
 
 }  // namespace
 
@@ -172,9 +133,9 @@ int UNeutralFileFormat::GetRecordTypeUtf8(std::string_view line) const {
 }
 
 int UNeutralFileFormat::FindRecordKeyUtf8(std::string_view key, int& type) const {
-    const RecordDefinition* record = definition_.RecordByKeyUtf8(key);
-    if (record == nullptr) return 0;
-    type = record->type;
+    const int found = definition_.RecordTypeByKeyUtf8(key);
+    if (found < 0) return 0;
+    type = found;
     return 1;
 }
 
@@ -340,11 +301,15 @@ void UNeutralFileFormat::ReadValue(FieldKind kind, std::wstring_view text,
 }
 
 std::wstring UNeutralFileFormat::FormatRecord(int /*type*/, const std::wstring& line) const {
-    return LayOutRecord(std::wstring_view(line));
+    std::wstring out;
+    nedit::layout::LayOut(std::wstring_view(line), out, Unchanged());
+    return out;
 }
 
 std::string UNeutralFileFormat::FormatRecordUtf8(std::string_view line) const {
-    return LayOutRecord(line);
+    std::string out;
+    nedit::layout::LayOut(line, out, Unchanged());
+    return out;
 }
 
 std::wstring UNeutralFileFormat::ReformatRecord(const std::wstring& record,

@@ -33,8 +33,10 @@ TEST_F(RecordFixture, NamelessCoordinatesTakeTheNameBeforeThemInWideAndUtf8Alike
     for (std::size_t i = 0; i < rows.size(); ++i) {
         const int type = format.GetRecordType(rows[i]);
         EXPECT_EQ(wide.Complete(format, type, rows[i]), expected[i]) << i;
-        utf8.CompleteUtf8(format, format.GetRecordTypeUtf8(nedit::ToUtf8(rows[i])),
-                          nedit::ToUtf8(rows[i]), out);
-        EXPECT_EQ(nedit::FromUtf8(out), expected[i]) << i;
+        const std::string row = nedit::ToUtf8(rows[i]);
+        EXPECT_EQ(
+            nedit::FromUtf8(utf8.CompleteUtf8(format, format.GetRecordTypeUtf8(row), row, out)),
+            expected[i])
+            << i;
     }
 }

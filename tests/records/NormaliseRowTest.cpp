@@ -29,6 +29,14 @@ INSTANTIATE_TEST_SUITE_P(
         // A comment is only upper-cased; an unknown key becomes one, so nothing is lost.
         GateCase{L"#  note:  Keep", L"#  NOTE:  KEEP"},
         GateCase{L"weather sunny", L"# WEATHER SUNNY"},
+        // Blanks go from the ends of each field and around its first "=", and nowhere else.
+        GateCase{L"ss  id = p1 , ha= 1 =2 ,  co = a b ", L"SS        ID=P1,HA=1 =2,CO=A B"},
+        GateCase{L"stn ,=5,, x", L"STN       ,=5,,X"},
+        GateCase{L"offset oa=1,or=2,,ou=3,", L"OFFSET    OA=1,OR=2,,OU=3,"},
+        GateCase{L"scale   1.5   m", L"SCALE     1.5   M"},
+        GateCase{L"job   a\tb", L"JOB       A\tB"}, GateCase{L"stn", L"STN"},
+        // A tab does not end a key; the key "STN\tID=A\tB" is no key.
+        GateCase{L"stn\tid=a\tb,hi=1", L"# STN\tID=A\tB,HI=1"},
         // Nothing stays nothing.
         GateCase{L"", L""}, GateCase{L"   ", L""}));
 
@@ -57,7 +65,9 @@ INSTANTIATE_TEST_SUITE_P(Rows, NormaliseRowUtf8Gate,
                                            L"stn id=zürich,hi=1.5", L"xyz ID=Æ,E=1",
                                            L"ss id=p"
                                            L"\u00e9,co=caf\u00e9",
-                                           L"insht 1.55", L"unit ul=m , ua=s"));
+                                           L"insht 1.55", L"unit ul=m , ua=s",
+                                           L"ss  id = p1 , ha= 1 =2 ,  co = a b ", L"stn ,=5,, x",
+                                           L"stn\tid=a\tb,hi=1", L"stn", L"job   a\tb"));
 
 // The gate of UTF-8 text is the gate of wide text: ASCII rows pass byte by byte, others
 // through wide text, and both give the same row.

@@ -62,8 +62,14 @@ bool LineReader::ReadLine(std::string& line) {
             }
         }
         any = true;
-        std::size_t stop = begin_;
-        while (stop < end_ && buffer_[stop] != '\n' && buffer_[stop] != '\r') ++stop;
+        // The line ends at the first LF, or at a CR before it.
+        const char* from = buffer_.data() + begin_;
+        const char* newline = static_cast<const char*>(std::memchr(from, '\n', end_ - begin_));
+        const std::size_t before =
+            newline != nullptr ? static_cast<std::size_t>(newline - from) : end_ - begin_;
+        const char* cr = static_cast<const char*>(std::memchr(from, '\r', before));
+        const std::size_t stop =
+            begin_ + (cr != nullptr ? static_cast<std::size_t>(cr - from) : before);
         const std::size_t piece = stop - begin_;
         if (line.size() < max_line_bytes_) {
             line.append(buffer_.data() + begin_, std::min(piece, max_line_bytes_ - line.size()));

@@ -4,6 +4,8 @@
 #include <wctype.h>
 
 #include <algorithm>
+#include <cstdint>
+#include <cstring>
 
 namespace nedit {
 namespace {
@@ -139,19 +141,25 @@ bool IsValidUtf8(std::string_view bytes) {
 }
 
 std::string_view TextLineAsUtf8(std::string_view bytes, std::string& buffer) {
-    if (IsValidUtf8(bytes)) return bytes;
+    if (IsAscii(bytes) || IsValidUtf8(bytes)) return bytes;
     buffer.clear();
     for (const char byte : bytes) AppendCodePoint(buffer, static_cast<unsigned char>(byte));
     return buffer;
 }
 
 std::string ToUpperUtf8(std::string_view text) {
-    if (!IsAscii(text)) return ToUtf8(ToUpper(FromUtf8(text)));
-    std::string out(text);
-    for (char& c : out) {
-        if (c >= 'a' && c <= 'z') c = static_cast<char>(c - 32);
-    }
+    std::string out;
+    ToUpperUtf8(text, out);
     return out;
+}
+
+void ToUpperUtf8(std::string_view text, std::string& out) {
+    if (!IsAscii(text)) {
+        out = ToUtf8(ToUpper(FromUtf8(text)));
+        return;
+    }
+    out.assign(text);
+    for (char& c : out) c = static_cast<char>(c - (c >= 'a' && c <= 'z' ? 32 : 0));
 }
 
 std::wstring DecodeTextLine(std::string_view bytes) {
@@ -180,8 +188,16 @@ void AppendUtf8(std::string& out, std::wstring_view text) {
 }
 
 bool IsAscii(std::string_view bytes) {
-    return std::all_of(bytes.begin(), bytes.end(),
-                       [](char c) { return static_cast<unsigned char>(c) < 0x80; });
+    // Eight bytes at a time: ASCII bytes have their top bit clear.
+    std::uint64_t high = 0;
+    std::size_t i = 0;
+    for (; i + 8 <= bytes.size(); i += 8) {
+        std::uint64_t word;
+        std::memcpy(&word, bytes.data() + i, 8);
+        high |= word;
+    }
+    for (; i < bytes.size(); ++i) high |= static_cast<unsigned char>(bytes[i]);
+    return (high & 0x8080808080808080ull) == 0;
 }
 
 std::wstring ToUpper(std::wstring_view text) {
@@ -265,6 +281,16 @@ std::wstring TrimChars(std::wstring_view text, std::wstring_view chars) {
 
 std::wstring Left(std::wstring_view text, std::size_t count) {
     return std::wstring(text.substr(0, std::min(count, text.size())));
+}
+
+std::string_view LeftUtf8(std::string_view text, std::size_t count) {
+    std::size_t characters = 0;
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        // A character starts at every byte that does not continue a sequence.
+        if (!IsContinuation(static_cast<unsigned char>(text[i])) && characters++ == count)
+            return text.substr(0, i);
+    }
+    return text;
 }
 
 int CountOf(std::wstring_view text, wchar_t c) {

@@ -38,6 +38,8 @@ std::wstring ToUpper(std::wstring_view text);
 std::wstring ToLower(std::wstring_view text);
 /// ToUpper of UTF-8 text, in UTF-8.
 std::string ToUpperUtf8(std::string_view text);
+/// The same into `out`, whose memory is reused.
+void ToUpperUtf8(std::string_view text, std::string& out);
 
 /// The two texts are equal when both are upper-cased as ToUpper does; nothing is allocated.
 bool EqualsIgnoreCase(std::wstring_view a, std::wstring_view b);
@@ -62,6 +64,8 @@ std::wstring TrimChars(std::wstring_view text, std::wstring_view chars);
 
 /// The first `count` characters (all of them when shorter).
 std::wstring Left(std::wstring_view text, std::size_t count);
+/// The same of UTF-8 text, as a view into it.
+std::string_view LeftUtf8(std::string_view text, std::size_t count);
 
 /// How many times `c` occurs in `text`.
 int CountOf(std::wstring_view text, wchar_t c);
