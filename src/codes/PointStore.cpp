@@ -4,14 +4,28 @@
 
 namespace nedit {
 
+const NameIndex& PointStore::Index() const {
+    if (!Indexed) {
+        Names.Clear();
+        Names.Reserve(Points.size());
+        for (std::size_t i = 0; i < Points.size(); ++i) Names.Set(Points[i].GetID(), i);
+        Indexed = true;
+    }
+    return Names;
+}
+
+void PointStore::Append(UNeditPt point) {
+    Points.push_back(std::move(point));
+    if (Indexed) Names.Set(Points.back().GetID(), Points.size() - 1);
+}
+
 unsigned PointStore::Put(UNeditPt point) {
-    const std::size_t found = Index.Find(point.GetID());
+    const std::size_t found = Index().Find(point.GetID());
     if (found != NameIndex::npos) {
         Points[found] = std::move(point);
         return static_cast<unsigned>(found);
     }
-    Points.push_back(std::move(point));
-    Index.Set(Points.back().GetID(), Points.size() - 1);
+    Append(std::move(point));
     return static_cast<unsigned>(Points.size() - 1);
 }
 
@@ -25,14 +39,21 @@ std::wstring PointStore::CodeFor(const std::wstring& name, std::wstring code) co
 
 unsigned PointStore::Save(UNeditPt point) {
     const int existing = IndexOf(point.GetID());
-    if (existing < 0) return Put(std::move(point));
+    return SaveAt(existing, std::move(point));
+}
+
+unsigned PointStore::SaveAt(int existing, UNeditPt point) {
+    if (existing < 0) {
+        Append(std::move(point));
+        return static_cast<unsigned>(Points.size() - 1);
+    }
     UNeditPt& stored = Points[static_cast<std::size_t>(existing)];
     if (!point.IsPTRecord() || stored.IsPTRecord()) stored = std::move(point);
     return static_cast<unsigned>(existing);
 }
 
 int PointStore::IndexOf(const std::wstring& name) const {
-    const std::size_t found = Index.Find(name);
+    const std::size_t found = Index().Find(name);
     return found == NameIndex::npos ? -1 : static_cast<int>(found);
 }
 
@@ -43,17 +64,16 @@ UNeditPt* PointStore::Find(const std::wstring& name) {
 
 void PointStore::Clear() {
     Points.clear();
-    Index.Clear();
+    Names.Clear();
+    Indexed = false;
 }
 
 void PointStore::Reserve(std::size_t count) {
     Points.reserve(count);
-    Index.Reserve(count);
 }
 
 void PointStore::RebuildIndex() {
-    Index.Clear();
-    for (std::size_t i = 0; i < Points.size(); ++i) Index.Set(Points[i].GetID(), i);
+    Indexed = false;
 }
 
 }  // namespace nedit

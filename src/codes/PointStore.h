@@ -2,6 +2,9 @@
 // A store of reduced points in the order they came, each name once, with a look-up by exact
 // name that stays constant in time, so that a run remains linear in its records. An index
 // into the store is stable until the store is thinned or cleared.
+//
+// The look-up by name is made at its first use: a caller that knows where each name stands
+// (the engine keeps its points by name id) saves by index and never pays for it.
 
 #include <cstddef>
 #include <string>
@@ -29,6 +32,9 @@ class PointStore {
     /// another PT point; an observed point is not replaced by a PT record of its name, and the
     /// new values are dropped. Gives the index of the name, stored or dropped.
     unsigned Save(UNeditPt point);
+    /// The same where the caller knows the index of the point's name: -1 for a name that the
+    /// store does not hold.
+    unsigned SaveAt(int existing, UNeditPt point);
 
     /// The index of the point of that name, or -1.
     int IndexOf(const std::wstring& name) const;
@@ -50,10 +56,15 @@ class PointStore {
     std::vector<UNeditPt>::const_iterator end() const { return Points.end(); }
 
   private:
+    /// The look-up by name, made when it is first needed and kept true after.
+    const NameIndex& Index() const;
+    void Append(UNeditPt point);
     void RebuildIndex();
 
     std::vector<UNeditPt> Points;
-    NameIndex Index{[this](std::size_t i) -> const std::wstring& { return Points[i].GetID(); }};
+    mutable NameIndex Names{
+        [this](std::size_t i) -> const std::wstring& { return Points[i].GetID(); }};
+    mutable bool Indexed = false;
 };
 
 template <class Keep>

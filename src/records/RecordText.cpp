@@ -148,3 +148,14 @@ void NormaliseRowUtf8(const UNeutralFileFormat& format, std::string_view text, s
     }
     if (out.size() > static_cast<std::size_t>(kMaxRowLength)) out.resize(kMaxRowLength);
 }
+
+std::string_view RowAsRead(std::string_view row, std::string& buffer) {
+    const bool ready =
+        row.size() <= static_cast<std::size_t>(kMaxRowLength) && nedit::IsAscii(row) &&
+        (row.empty() || (!nedit::IsBlank(row.front()) && !nedit::IsBlank(row.back()))) &&
+        std::none_of(row.begin(), row.end(), [](char c) { return c >= 'a' && c <= 'z'; });
+    if (ready) return row;
+    buffer = nedit::ToUtf8(nedit::ToUpper(
+        nedit::TrimView(std::wstring_view(nedit::FromUtf8(row)).substr(0, kMaxRowLength))));
+    return buffer;
+}

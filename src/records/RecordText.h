@@ -34,6 +34,11 @@ int GetAngleType(std::wstring_view row);
 /// comment with "# " in front, so that nothing is lost. The result is cut to the row limit of
 /// 255 characters.
 std::wstring NormaliseRow(const UNeutralFileFormat& format, const std::wstring& text);
+/// A row as the reduction reads it: at most 255 characters, trimmed, in upper case. A row
+/// that came through the gate is so already and is given back itself; another is made in
+/// `buffer`.
+std::string_view RowAsRead(std::string_view row, std::string& buffer);
+
 /// The same gate for UTF-8 text, into `out`; a row of ASCII text passes it without being
 /// widened, and gives the same row as NormaliseRow.
 void NormaliseRowUtf8(const UNeutralFileFormat& format, std::string_view text, std::string& out);

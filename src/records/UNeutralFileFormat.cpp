@@ -204,7 +204,7 @@ bool UNeutralFileFormat::GetRecordTemplate(int type, std::wstring& text) const {
 }
 
 template <typename Char, typename Store>
-int UNeutralFileFormat::WalkFields(int type, std::basic_string_view<Char> line, Store store) {
+int UNeutralFileFormat::WalkFields(int type, std::basic_string_view<Char> line, Store store) const {
     using View = std::basic_string_view<Char>;
     const RecordDefinition* record = definition_.RecordByType(type);
     if (record == nullptr || (!record->single_field && record->fields.empty())) return 0;
@@ -269,17 +269,29 @@ void UNeutralFileFormat::StoreField(int id, FieldKind kind, std::wstring_view te
     if (!value.empty()) SetCurrentValue(id, value);
 }
 
+int UNeutralFileFormat::PeekRecord(int type, std::string_view line, RecordFields& fields) const {
+    fields.clear();
+    return WalkFields(type, line, [&](int id, FieldKind kind, std::string_view value) {
+        fields[id] = ValueOf(kind, value);
+    });
+}
+
 void UNeutralFileFormat::StoreField(int id, FieldKind kind, std::string_view text,
                                     RecordFields& fields) {
     RecordValue& value = fields[id];
-    value = RecordValue();
+    value = ValueOf(kind, text);
+    if (!value.empty()) SetCurrentValue(id, value);
+}
+
+RecordValue UNeutralFileFormat::ValueOf(FieldKind kind, std::string_view text) const {
+    RecordValue value;
     if (Converts(kind, text.empty())) {
         value.converted = true;
         value.number = Converted(kind, nedit::TextToDouble(text));
     } else {
         value.text = text;
     }
-    if (!value.empty()) SetCurrentValue(id, value);
+    return value;
 }
 
 bool UNeutralFileFormat::Converts(FieldKind kind, bool empty) const {

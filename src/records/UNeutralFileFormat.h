@@ -75,6 +75,10 @@ class UNeutralFileFormat {
     /// them) or as numbers in working units; what the values read as, and the current values
     /// it leaves, are those of ProcessRecord.
     int ReadRecord(int type, std::string_view line, RecordFields& fields);
+    /// The same, leaving the current values alone: the fields a record names and their
+    /// texts, as an index of the rows needs them. Values in other units are converted with
+    /// the units in force now.
+    int PeekRecord(int type, std::string_view line, RecordFields& fields) const;
 
     /// The template of a record type: its field keys, each with "=", joined by commas
     /// ("ID=,HI=,CO=" for a station); empty for a single-field record. False for an unknown type.
@@ -150,7 +154,9 @@ class UNeutralFileFormat {
     void StoreField(int id, FieldKind kind, std::string_view text, RecordFields& fields);
     /// Gives each field of a record's text, with its value text, to `store`.
     template <typename Char, typename Store>
-    int WalkFields(int type, std::basic_string_view<Char> line, Store store);
+    int WalkFields(int type, std::basic_string_view<Char> line, Store store) const;
+    /// The value of a field read from UTF-8 text.
+    RecordValue ValueOf(FieldKind kind, std::string_view text) const;
     const FieldDefinition* FieldOfKey(std::wstring_view key) const;
     const FieldDefinition* FieldOfKey(std::string_view key) const;
     CurrentValue* CurrentOf(int id);

@@ -12,11 +12,13 @@
 
 namespace {
 
-// The lowest marker row: the list is searched from its last row upward.
+// The lowest marker row: the list is searched from its last row upward. The marker is
+// ASCII, so a row is compared with it in UTF-8.
 int FindMarker(const nedit::RowSource& list) {
+    const std::string marker = nedit::ToUtf8(kAdjustedPointsMarker);
     for (int row = list.GetItemCount() - 1; row >= 0; --row) {
-        if (nedit::ToUpper(nedit::TrimView(list.GetItemText(row))) == kAdjustedPointsMarker)
-            return row;
+        const std::string_view text = nedit::TrimView(list.GetRowUtf8(row));
+        if (text.size() == marker.size() && nedit::ToUpperUtf8(text) == marker) return row;
     }
     return -1;
 }
@@ -51,18 +53,20 @@ int UNeditDatabase::SaveAdditionPt2CtrlList(nedit::RowSource* list) {
     if (list == nullptr || list->GetItemCount() == 0 || AddPtList.empty()) return 0;
     const int marker = FindMarker(*list);
     int insert_at = marker >= 0 ? marker : list->GetItemCount();
+    // The rows are indexed by name once, and the index follows the rows written here.
+    ForgetOtherRows();
     for (const UNeditPt& point : AddPtList) {
         double e = 0.0, n = 0.0, h = 0.0;
-        const int row = FindXYZ(*list, point.GetID(), e, n, h);
+        const int row = FindCoordinateRow(*list, point.GetID(), kCoordinateRows, &e, &n, &h);
         const std::wstring text = FormatXYZRecord(point.GetID(), point.x, point.y, point.z);
         if (row < 0) {
-            list->AddRecord(insert_at++, text);
+            InsertRow(*list, insert_at++, text);
         } else if (!Is_Zero(point.x - e, false) || !Is_Zero(point.y - n, false) ||
                    !Is_Zero(point.z - h, false)) {
-            list->DeleteItem(row);
-            list->AddRecord(row, text);
+            ReplaceRow(*list, row, text);
         }
     }
+    ForgetOtherRows();
     return 1;
 }
 

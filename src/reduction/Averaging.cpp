@@ -116,17 +116,17 @@ int UNeditDatabase::FindAverageMeas(const MeasurementList& measurements, double&
 }
 
 int UNeditDatabase::ProcessAverageMeas() {
-    std::size_t steps = 0;
-    for (const auto& station : Stations)
-        steps += 1 + station->SSList.size() + station->FSList.size();
-    std::size_t done = 0;
-    for (const auto& station : Stations) {
+    // Point-only nodes have nothing to average; they count one step each.
+    std::size_t steps = Nodes.size();
+    for (const STNSTRUCT& station : Setups) steps += station.SSList.size() + station.FSList.size();
+    std::size_t done = PointNodes.size();
+    for (STNSTRUCT& station : Setups) {
         if (AbortRequested()) return 0;
-        done += 1 + station->SSList.size() + station->FSList.size();
+        done += 1 + station.SSList.size() + station.FSList.size();
         UpdateProgress(static_cast<unsigned>(100 * done / steps), kGeneratingGraphics);
-        for (const auto& target : station->BSList) AverageTarget(*this, *target);
-        for (const auto& target : station->FSList) AverageTarget(*this, *target);
-        for (const auto& target : station->SSList) {
+        for (SSSTRUCT* target : station.BSList) AverageTarget(*this, *target);
+        for (SSSTRUCT* target : station.FSList) AverageTarget(*this, *target);
+        for (SSSTRUCT* target : station.SSList) {
             if (!target->SkipMean) AverageTarget(*this, *target);
         }
     }
@@ -134,7 +134,8 @@ int UNeditDatabase::ProcessAverageMeas() {
 }
 
 int UNeditDatabase::ProcessAverageAngle() {
-    for (const auto& station : Stations) {
+    for (STNSTRUCT& node : Setups) {
+        STNSTRUCT* station = &node;
         double reference = station->BkAngle;
         if (!station->BSList.empty() && station->BSList.front()->MeanValid) {
             reference = station->BSList.front()->HAng;
@@ -145,10 +146,10 @@ int UNeditDatabase::ProcessAverageAngle() {
             target.AngleFromBS = h - reference;
             target.AngleValid = 1;
         };
-        for (const auto& target : station->FSList) {
+        for (SSSTRUCT* target : station->FSList) {
             if (target->MeanValid) set_angle(*target);
         }
-        for (const auto& target : station->SSList) {
+        for (SSSTRUCT* target : station->SSList) {
             if (target->MeanValid && !target->SkipMean) set_angle(*target);
         }
     }

@@ -16,7 +16,7 @@
 namespace {
 
 // An empty name in the bearing store stands as this text, so it has a key like any other.
-constexpr const wchar_t* kNoName = L"-99999";
+constexpr const wchar_t* kNameOfNone = L"-99999";
 
 std::wstring BearingKey(const std::wstring& from, const std::wstring& to) {
     return from + L'\x1f' + to;
@@ -30,70 +30,96 @@ double Reverse(double bearing) {
 
 int UNeditDatabase::findCoord(const std::wstring& name, double& e, double& n, double& z,
                               std::wstring& code, int fix, bool askUser) {
-    {
-        for (const STNSTRUCT* station = FirstNamed(name); station != nullptr;
-             station = station->NextSameName) {
-            if (!station->CoordKnown) {
-                code = station->StnCode;
-                continue;
-            }
-            e = station->East;
-            n = station->North;
-            z = station->Height;
-            code = station->StnCode;
-            if (station->CoordFixed == 1 || fix == 0) return 1;
-            break;
-        }
-    }
-    if (GetPointFromPtList(name, e, n, z, code, 1)) return 1;
+    return FindCoordOf(NameOf(name), e, n, z, code, fix, askUser);
+}
 
-    if (JobHasPoint(name)) {
-        if (DbCoordNames.count(name) != 0 && GetCoordFromSvyDoc(name, e, n, z, code)) {
-            setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
+int UNeditDatabase::FindCoordOf(NameId name, double& e, double& n, double& z, std::wstring& code,
+                                int fix, bool askUser) {
+    for (std::uint32_t node = FirstNodeOf(name); node != NodeEntry::kNone;
+         node = Nodes[node].NextSameName) {
+        int fixed = 0;
+        if (Nodes[node].IsPointOnly()) {
+            const PointNode& point = PointNodes[Nodes[node].Index()];
+            e = point.East;
+            n = point.North;
+            z = point.Height;
+            code = CodeText(point.Code);
+            fixed = point.CoordFixed;
+        } else {
+            const STNSTRUCT& station = Setups[Nodes[node].Index()];
+            code = station.StnCode;
+            if (!station.CoordKnown) continue;
+            e = station.East;
+            n = station.North;
+            z = station.Height;
+            fixed = station.CoordFixed;
+        }
+        if (fixed == 1 || fix == 0) return 1;
+        break;
+    }
+    if (PointFromPtList(name, e, n, z, code, 1)) return 1;
+
+    const std::wstring_view text = Names.Name(name);
+    if (SurveyDoc != nullptr && JobHasPoint(std::wstring(text))) {
+        if (DbCoordNames.count(text) != 0 &&
+            GetCoordFromSvyDoc(std::wstring(text), e, n, z, code)) {
+            SetCoordOf(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
             return 1;
         }
-        if (LocalCoordNames.count(name) == 0) {
-            if (!getCoord(name, &e, &n, &z, code, 1, askUser)) {
+        if (LocalCoordNames.count(text) == 0) {
+            if (!GetCoordOf(name, &e, &n, &z, code, 1, askUser)) {
                 ErrorCode = -11;
                 return 0;
             }
-            if (DbCoordNames.count(name) != 0) return 1;
-            setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
-            SaveTravPoint(name, e, n, z, code, 1);
+            if (DbCoordNames.count(text) != 0) return 1;
+            SetCoordOf(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
+            SaveTravPoint(std::wstring(text), e, n, z, code, 1);
             return 1;
         }
     }
 
-    const auto known = KnownCoordMap.find(name);
-    if (known == KnownCoordMap.end()) {
-        if (!GetPointFromPtList(name, e, n, z, code, 0)) return 0;
-        setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
+    const KnownCoord* known = KnownCoordOf(name);
+    if (known == nullptr) {
+        if (!PointFromPtList(name, e, n, z, code, 0)) return 0;
+        SetCoordOf(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
         return 1;
     }
-    e = known->second.East;
-    n = known->second.North;
-    z = known->second.Height;
-    if (LocalCoordNames.count(name) != 0) {
-        setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
+    e = known->East;
+    n = known->North;
+    z = known->Height;
+    if (LocalCoordNames.count(text) != 0) {
+        SetCoordOf(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
         return 1;
     }
-    if (!getCoord(name, &e, &n, &z, code, 1, askUser)) {
+    if (!GetCoordOf(name, &e, &n, &z, code, 1, askUser)) {
         ErrorCode = -11;
         return 0;
     }
-    setCoord(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
-    SaveTravPoint(name, e, n, z, code, 1);
+    SetCoordOf(name, e, n, z, code, kSetCoordOverwrite, fix, 0);
+    SaveTravPoint(std::wstring(text), e, n, z, code, 1);
     return 1;
+}
+
+const KnownCoord* UNeditDatabase::KnownCoordOf(NameId name) const {
+    if (KnownCoordMap.empty()) return nullptr;
+    const auto found = KnownCoordMap.find(name);
+    return found == KnownCoordMap.end() ? nullptr : &found->second;
 }
 
 int UNeditDatabase::getCoord(const std::wstring& name, double* e, double* n, double* z,
                              std::wstring& code, int clear, bool showDialog) {
+    return GetCoordOf(NameOf(name), e, n, z, code, clear, showDialog);
+}
+
+int UNeditDatabase::GetCoordOf(NameId id, double* e, double* n, double* z, std::wstring& code,
+                               int clear, bool showDialog) {
     if (ErrorCode != 0 && GetError() != 0) return 0;
     if (clear) {
         *e = *n = 0.0;
         *z = kNoHeight;
         code.clear();
     }
+    const std::wstring name(Names.Name(id));
     UCoordEntryDlg dialog(
         CoordsOrderXY() ? UCoordEntryDlg::kEastFirstId : UCoordEntryDlg::kNorthFirstId, Host);
     dialog.SetName(name);
@@ -110,21 +136,19 @@ int UNeditDatabase::getCoord(const std::wstring& name, double* e, double* n, dou
         }
         dialog.InitXYZSvy(job_e, job_n, job_z, job_code);
     }
-    const auto known = KnownCoordMap.find(name);
-    if (known != KnownCoordMap.end()) {
+    if (const KnownCoord* known = KnownCoordOf(id)) {
         if (LocalCoordNames.count(name) != 0) {
-            *e = known->second.East;
-            *n = known->second.North;
-            *z = known->second.Height;
+            *e = known->East;
+            *n = known->North;
+            *z = known->Height;
             return 1;
         }
         double pe = 0.0, pn = 0.0, pz = kNoHeight;
         std::wstring point_code;
-        if (GetPointFromPtList(name, pe, pn, pz, point_code, 0)) {
+        if (PointFromPtList(id, pe, pn, pz, point_code, 0)) {
             dialog.InitXYZLocal(pe, pn, pz, point_code);
         } else {
-            dialog.InitXYZLocal(known->second.East, known->second.North, known->second.Height,
-                                code);
+            dialog.InitXYZLocal(known->East, known->North, known->Height, code);
         }
     }
     const int answer = showDialog ? dialog.process(name, UseForAll) : dialog.ProcessOnly(name);
@@ -134,9 +158,9 @@ int UNeditDatabase::getCoord(const std::wstring& name, double* e, double* n, dou
     *z = dialog.getZ();
     code = dialog.getCode();
     if (dialog.GetChosenSource() == UCoordEntryDlg::Source::Database) {
-        DbCoordNames[name] = true;
+        DbCoordNames.insert(name);
     } else {
-        LocalCoordNames[name] = true;
+        LocalCoordNames.insert(name);
     }
     return 1;
 }
@@ -144,50 +168,71 @@ int UNeditDatabase::getCoord(const std::wstring& name, double* e, double* n, dou
 int UNeditDatabase::setCoord(const std::wstring& name, double e, double n, double z,
                              const std::wstring& code, int flags, int fix, int ptFlag) {
     if (name.empty()) return 0;
-    if (STNSTRUCT* first = FirstNamed(name)) {
-        bool written = false;
-        for (STNSTRUCT* station = first; station != nullptr; station = station->NextSameName) {
-            if (station->CoordKnown && (flags & kSetCoordOverwrite) == 0) {
-                SavePoint(name, e, n, z, code, ptFlag, 0, 0);
+    return SetCoordOf(NameOf(name), e, n, z, code, flags, fix, ptFlag);
+}
+
+int UNeditDatabase::SetCoordOf(NameId name, double e, double n, double z, std::wstring_view code,
+                               int flags, int fix, int /*ptFlag*/) {
+    if (Names.Name(name).empty()) return 0;
+    const NameId code_id = code.empty() ? kNoName : CodeOf(code);
+    bool any = false;
+    bool written = false;
+    for (std::uint32_t node = FirstNodeOf(name); node != NodeEntry::kNone;
+         node = Nodes[node].NextSameName) {
+        any = true;
+        // Every node of a point-only name knows its coordinates.
+        if (Nodes[node].IsPointOnly()) {
+            PointNode& point = PointNodes[Nodes[node].Index()];
+            if ((flags & kSetCoordOverwrite) == 0) {
+                SavePointOf(name, e, n, z, code, 0, 0);
                 continue;
             }
-            station->East = e;
-            station->North = n;
-            station->Height = z;
-            if (!code.empty()) station->StnCode = code;
-            station->CoordFixed = fix;
-            station->CoordKnown = 1;
-            SavePoint(name, e, n, z, station->StnCode, ptFlag, 0, 0);
-            written = true;
+            point.East = e;
+            point.North = n;
+            point.Height = z;
+            if (code_id != kNoName) point.Code = code_id;
+            point.CoordFixed = fix;
+            SavePointOf(name, e, n, z, CodeText(point.Code), 0, 0);
+        } else {
+            STNSTRUCT& station = Setups[Nodes[node].Index()];
+            if (station.CoordKnown && (flags & kSetCoordOverwrite) == 0) {
+                SavePointOf(name, e, n, z, code, 0, 0);
+                continue;
+            }
+            station.East = e;
+            station.North = n;
+            station.Height = z;
+            if (code_id != kNoName) station.StnCode = Codes.Name(code_id);
+            station.CoordFixed = fix;
+            station.CoordKnown = 1;
+            SavePointOf(name, e, n, z, station.StnCode, 0, 0);
         }
-        return written ? 1 : 0;
+        written = true;
     }
-    auto point = std::make_unique<STNSTRUCT>();
-    point->StnName = name;
-    point->East = e;
-    point->North = n;
-    point->Height = z;
-    point->StnCode = code;
-    point->CoordKnown = 1;
-    point->PointOnly = 1;
-    point->HMode = HMode;
-    point->VMode = VMode;
-    point->AngleUnit = AngleUnit;
-    point->LengthUnit = LengthUnit;
-    AppendStation(std::move(point));
-    SavePoint(name, e, n, z, code, ptFlag, 0, 0);
+    if (any) return written ? 1 : 0;
+    AppendPointNode(name, e, n, z, code_id);
+    SavePointOf(name, e, n, z, code, 0, 0);
     return 1;
 }
 
 int UNeditDatabase::GetCoordFromStnList(const std::wstring& name, double& e, double& n, double& z,
                                         std::wstring& code) const {
-    for (const STNSTRUCT* station = FirstNamed(name); station != nullptr;
-         station = station->NextSameName) {
-        if (!station->CoordKnown) continue;
-        e = station->East;
-        n = station->North;
-        z = station->Height;
-        code = station->StnCode;
+    for (std::uint32_t node = FirstNodeOf(Names.Find(name)); node != NodeEntry::kNone;
+         node = Nodes[node].NextSameName) {
+        if (Nodes[node].IsPointOnly()) {
+            const PointNode& point = PointNodes[Nodes[node].Index()];
+            e = point.East;
+            n = point.North;
+            z = point.Height;
+            code = CodeText(point.Code);
+            return 1;
+        }
+        const STNSTRUCT& station = Setups[Nodes[node].Index()];
+        if (!station.CoordKnown) continue;
+        e = station.East;
+        n = station.North;
+        z = station.Height;
+        code = station.StnCode;
         return 1;
     }
     return 0;
@@ -195,7 +240,12 @@ int UNeditDatabase::GetCoordFromStnList(const std::wstring& name, double& e, dou
 
 int UNeditDatabase::GetPointFromPtList(const std::wstring& name, double& e, double& n, double& z,
                                        std::wstring& code, unsigned mode) const {
-    const int index = GetPointIdx(name);
+    return PointFromPtList(Names.Find(name), e, n, z, code, mode);
+}
+
+int UNeditDatabase::PointFromPtList(NameId name, double& e, double& n, double& z,
+                                    std::wstring& code, unsigned mode) const {
+    const int index = PointOf(name);
     if (index < 0) return 0;
     const UNeditPt& point = PointList[static_cast<std::size_t>(index)];
     e = point.x;
@@ -205,37 +255,78 @@ int UNeditDatabase::GetPointFromPtList(const std::wstring& name, double& e, doub
     return mode == 1 && point.IsPTRecord() ? 0 : 1;
 }
 
-int UNeditDatabase::FindCoordinateRow(const nedit::RowSource* rows, const std::wstring& name,
-                                      bool coordinates, int type, double* e, double* n, double* z) {
-    if (rows == nullptr || Doc == nullptr) return -1;
-    for (int row = 0; row < rows->GetItemCount(); ++row) {
-        const std::wstring text = nedit::ToUpper(nedit::TrimView(rows->GetItemText(row)));
-        const int row_type = Doc->GetRecordType(text);
-        const bool wanted =
-            coordinates ? (row_type == rec::Xyz || row_type == rec::Yxz) : row_type == type;
-        if (!wanted || !Doc->ProcessRecord(row_type, text, Fields)) continue;
-        if (GetValue(fld::ID) != name) continue;
-        if (coordinates) {
-            *e = nedit::TextToDouble(GetValue(fld::E));
-            *n = nedit::TextToDouble(GetValue(fld::N));
-            *z = nedit::TextToDouble(GetValue(fld::H));
-        }
-        return row;
+RowIndex& UNeditDatabase::IndexOf(const nedit::RowSource& rows, int type) {
+    std::map<int, RowIndex>& indexes = &rows == Rows ? RowIndexes : OtherRowIndexes;
+    if (&rows != Rows && OtherRows != &rows) {
+        OtherRowIndexes.clear();
+        OtherRows = &rows;
     }
-    return -1;
+    auto found = indexes.find(type);
+    if (found == indexes.end()) {
+        std::vector<int> types =
+            type == kCoordinateRows ? std::vector<int>{rec::Xyz, rec::Yxz} : std::vector<int>{type};
+        found = indexes.emplace(type, RowIndex(*Doc, Names, std::move(types))).first;
+    }
+    return found->second;
+}
+
+int UNeditDatabase::FindCoordinateRow(const nedit::RowSource& rows, const std::wstring& name,
+                                      int type, double* e, double* n, double* z) {
+    if (Doc == nullptr) return -1;
+    const int row = IndexOf(rows, type).Find(rows, name, Fields);
+    if (row >= 0 && e != nullptr) {
+        *e = Number(fld::E);
+        *n = Number(fld::N);
+        *z = Number(fld::H);
+    }
+    return row;
 }
 
 int UNeditDatabase::FindXYZ(const std::wstring& name, double& e, double& n, double& z) {
-    return FindCoordinateRow(Rows, name, true, rec::Xyz, &e, &n, &z);
+    if (Rows == nullptr) return -1;
+    return FindCoordinateRow(*Rows, name, kCoordinateRows, &e, &n, &z);
 }
 
 int UNeditDatabase::FindXYZ(const nedit::RowSource& rows, const std::wstring& name, double& e,
                             double& n, double& z) {
-    return FindCoordinateRow(&rows, name, true, rec::Xyz, &e, &n, &z);
+    ForgetOtherRows();
+    const int row = FindCoordinateRow(rows, name, kCoordinateRows, &e, &n, &z);
+    ForgetOtherRows();
+    return row;
+}
+
+void UNeditDatabase::ForgetOtherRows() {
+    OtherRowIndexes.clear();
+    OtherRows = nullptr;
 }
 
 int UNeditDatabase::FindRecord(int type, const std::wstring& name) {
-    return FindCoordinateRow(Rows, name, false, type, nullptr, nullptr, nullptr);
+    // Rows of no known type are never records of a type.
+    if (Rows == nullptr || type == rec::None) return -1;
+    return FindCoordinateRow(*Rows, name, type, nullptr, nullptr, nullptr);
+}
+
+int UNeditDatabase::InsertRow(nedit::RowSource& rows, int row, const std::wstring& text) {
+    const std::uint64_t before = rows.GetRevision();
+    const int at = rows.AddRecord(row, text);
+    if (at >= 0) {
+        for (auto& [type, index] : &rows == Rows ? RowIndexes : OtherRowIndexes)
+            index.Inserted(rows, at, before);
+    }
+    return at;
+}
+
+int UNeditDatabase::AppendRow(nedit::RowSource& rows, const std::wstring& text) {
+    return InsertRow(rows, rows.GetItemCount(), text);
+}
+
+void UNeditDatabase::ReplaceRow(nedit::RowSource& rows, int row, const std::wstring& text) {
+    const std::uint64_t before = rows.GetRevision();
+    const std::string old(rows.GetRowUtf8(row));
+    rows.DeleteItem(row);
+    if (rows.AddRecord(row, text) != row) return;
+    for (auto& [type, index] : &rows == Rows ? RowIndexes : OtherRowIndexes)
+        index.Replaced(rows, row, old, before);
 }
 
 std::wstring UNeditDatabase::FormatXYZRecord(const std::wstring& name, double e, double n,
@@ -274,8 +365,8 @@ std::wstring UNeditDatabase::FormatBKBRecord(const std::wstring& name, double re
 }
 
 double UNeditDatabase::GetBearingFromArray(std::wstring from, std::wstring to) const {
-    if (from.empty()) from = kNoName;
-    if (to.empty()) to = kNoName;
+    if (from.empty()) from = kNameOfNone;
+    if (to.empty()) to = kNameOfNone;
     int direction = 0;
     const int index = GetBearingArray(from, to, direction);
     if (index < 0) return -1.0;
@@ -304,8 +395,8 @@ int UNeditDatabase::GetBearingArray(const std::wstring& from, const std::wstring
 }
 
 int UNeditDatabase::InsertBearingArray(std::wstring from, std::wstring to, double bearing) {
-    if (from.empty()) from = kNoName;
-    if (to.empty()) to = kNoName;
+    if (from.empty()) from = kNameOfNone;
+    if (to.empty()) to = kNameOfNone;
     int direction = 0;
     const int index = GetBearingArray(from, to, direction);
     if (index < 0) {

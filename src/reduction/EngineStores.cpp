@@ -3,22 +3,63 @@
 // (codes/); what is the engine's is the traverse flag, the indices into the point list, and
 // the thinning before a re-run.
 
+#include <algorithm>
 #include <cmath>
 #include <unordered_set>
 
+#include "platform/text/WideText.h"
 #include "reduction/UNeditDatabase.h"
 
 unsigned UNeditDatabase::SavePoint(const std::wstring& name, double x, double y, double z,
                                    std::wstring code, int /*ptFlag*/, unsigned flags, int derived) {
-    code = PointList.CodeFor(name, std::move(code));
+    return SavePointOf(NameOf(name), x, y, z, code, flags, derived);
+}
+
+unsigned UNeditDatabase::SavePointOf(NameId name, double x, double y, double z,
+                                     std::wstring_view code, unsigned flags, int derived) {
+    // The point of a name is found by its id, once; points of one code share its text.
+    const int existing = PointOf(name);
+    std::shared_ptr<const std::wstring> point_code;
+    const std::wstring_view trimmed = nedit::TrimView(code);
+    if (!trimmed.empty()) {
+        point_code = SharedCode(CodeOf(trimmed));
+    } else if (existing >= 0) {
+        point_code = PointList[static_cast<std::size_t>(existing)].GetSharedCode();
+    }
     unsigned point_flags = 0;
     if ((flags & kSaveFromPTRecord) != 0) point_flags |= UNeditPt::kFromPTRecord;
     if (derived != 0) point_flags |= UNeditPt::kInterpolated;
     // Layer, colour, mark, contour use and the control flag come from the survey code
     // library; without one the point keeps its defaults.
-    const unsigned index = PointList.Save(UNeditPt(name, x, y, z, code, point_flags));
-    if (TravFlag) SaveTravPoint(name, x, y, z, code, 0);
+    const std::wstring id(Names.Name(name));
+    const unsigned index =
+        PointList.SaveAt(existing, UNeditPt(id, x, y, z, point_code, point_flags));
+    if (existing < 0) {
+        if (name >= PointOfName.size())
+            PointOfName.resize(std::max<std::size_t>(name + 1, Names.size()), -1);
+        PointOfName[name] = static_cast<std::int32_t>(index);
+    }
+    if (TravFlag) SaveTravPoint(id, x, y, z, point_code ? *point_code : std::wstring(), 0);
     return index;
+}
+
+const std::shared_ptr<const std::wstring>& UNeditDatabase::SharedCode(NameId code) {
+    if (code >= CodeTexts.size()) CodeTexts.resize(Codes.size());
+    if (!CodeTexts[code]) CodeTexts[code] = std::make_shared<const std::wstring>(Codes.Name(code));
+    return CodeTexts[code];
+}
+
+int UNeditDatabase::PointOf(NameId name) const {
+    return name < PointOfName.size() ? PointOfName[name] : -1;
+}
+
+void UNeditDatabase::IndexPoints() {
+    PointOfName.assign(Names.size(), -1);
+    for (std::size_t i = 0; i < PointList.size(); ++i) {
+        const NameId name = Names.Intern(PointList[i].GetID());
+        if (name >= PointOfName.size()) PointOfName.resize(name + 1, -1);
+        PointOfName[name] = static_cast<std::int32_t>(i);
+    }
 }
 
 unsigned UNeditDatabase::SaveTravPoint(const std::wstring& name, double x, double y, double z,
@@ -48,6 +89,7 @@ void UNeditDatabase::DeleteTopoLines() {
     PointList.KeepIf([&named](const UNeditPt& point) {
         return point.GetPtFlag() != 0 || named.count(point.GetID()) != 0;
     });
+    IndexPoints();
 }
 
 void UNeditDatabase::SetMinMaxCoord() {
@@ -66,7 +108,7 @@ void UNeditDatabase::SetMinMaxCoord() {
 }
 
 int UNeditDatabase::GetPointIdx(const std::wstring& name) const {
-    return PointList.IndexOf(name);
+    return PointOf(Names.Find(name));
 }
 int UNeditDatabase::GetAddPointIdx(const std::wstring& name) const {
     return AddPtList.IndexOf(name);
@@ -76,7 +118,8 @@ int UNeditDatabase::GetTravPointIdx(const std::wstring& name) const {
 }
 
 UNeditPt* UNeditDatabase::SearchPt(const std::wstring& name) {
-    return PointList.Find(name);
+    const int index = PointOf(Names.Find(name));
+    return index < 0 ? nullptr : &PointList[static_cast<std::size_t>(index)];
 }
 
 UNeditPt* UNeditDatabase::GetLastPoint() {

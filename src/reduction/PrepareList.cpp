@@ -9,6 +9,7 @@
 #include "platform/text/Format.h"
 #include "platform/text/NumberText.h"
 #include "platform/text/WideText.h"
+#include "records/RecordText.h"
 #include "records/RecordTypes.h"
 #include "records/RowSource.h"
 #include "reduction/UNeditDatabase.h"
@@ -26,28 +27,14 @@ constexpr double kNoInstrumentHeight = 0.0001;
 // the mean radius, so that the correction stays finite and close to what was meant.
 constexpr double kMeanEarthRadiusMetres = 6370000.0;
 
-double Number(const std::wstring& text) {
-    return nedit::TextToDouble(text);
+void AppendNames(SparseList<std::wstring>& to, const std::vector<std::wstring>& names) {
+    to.append(names);
 }
 
-void AppendNames(std::vector<std::wstring>& to, const std::vector<std::wstring>& names) {
-    to.insert(to.end(), names.begin(), names.end());
-}
-
-// A row as the reduction reads it: at most 255 characters, trimmed, in upper case. Rows
-// that came through the list's gate are so already and are read in place.
-const std::wstring& ReadRow(const std::wstring& row, std::wstring& buffer) {
-    const bool ready =
-        row.size() <= static_cast<std::size_t>(kMaxRowLength) &&
-        (row.empty() || (!nedit::IsBlank(row.front()) && !nedit::IsBlank(row.back()))) &&
-        std::none_of(row.begin(), row.end(), [](wchar_t c) { return c >= L'a'; });
-    if (ready) return row;
-    buffer = nedit::ToUpper(nedit::TrimView(std::wstring_view(row).substr(0, kMaxRowLength)));
-    return buffer;
-}
-
-wchar_t FirstLetter(const std::wstring& text, wchar_t fallback) {
-    return text.empty() ? fallback : text[0];
+wchar_t FirstLetter(const RecordValue& value, wchar_t fallback) {
+    if (value.empty()) return fallback;
+    if (!value.converted && static_cast<unsigned char>(value.text[0]) < 0x80) return value.text[0];
+    return value.WideText()[0];
 }
 
 }  // namespace
@@ -59,17 +46,19 @@ int UNeditDatabase::PrepareList() {
         ErrorCode = 1;
         return 0;
     }
-    std::vector<std::wstring> rows;
-    rows.reserve(static_cast<std::size_t>(Rows->GetItemCount()));
-    for (int row = 0; row < Rows->GetItemCount(); ++row) rows.push_back(Rows->GetItemText(row));
-    return PrepareRows(rows);
+    return PrepareRows(
+        static_cast<std::size_t>(Rows->GetItemCount()),
+        [this](std::size_t row, std::string&) { return Rows->GetRowUtf8(static_cast<int>(row)); });
 }
 
 int UNeditDatabase::PrepareList(const std::vector<std::wstring>& rows) {
     DbCoordNames.clear();
     LocalCoordNames.clear();
     if (rows.empty()) return 0;
-    return PrepareRows(rows);
+    return PrepareRows(rows.size(), [&rows](std::size_t row, std::string& buffer) {
+        buffer = nedit::ToUtf8(rows[row]);
+        return std::string_view(buffer);
+    });
 }
 
 void UNeditDatabase::ResetPassValues() {
@@ -78,78 +67,105 @@ void UNeditDatabase::ResetPassValues() {
     CurSS = nullptr;
 }
 
-int UNeditDatabase::PrepareRows(const std::vector<std::wstring>& rows) {
+template <typename RowAt>
+int UNeditDatabase::PrepareRows(std::size_t count, RowAt rowAt) {
     ResetPassValues();
     DeleteList();
-    // Every row may name a station or a point: room for all of them up front spares the
-    // name tables their rehashing as a large survey fills them.
-    PointList.Reserve(rows.size());
     TravFlag = 0;
-    const std::size_t count = rows.size();
-    std::wstring normalised;
+    Filing = true;
+    std::string text;
+    std::string normalised;
     for (std::size_t index = 0; index < count; ++index) {
-        if (AbortRequested()) return 0;
+        if (AbortRequested()) {
+            Filing = false;
+            return 0;
+        }
         UpdateProgress(static_cast<unsigned>(100 * (index + 1) / count), kGeneratingGraphics);
-        const std::wstring& row = ReadRow(rows[index], normalised);
-        if (row == kAdjustedPointsMarker) TravFlag = 1;
-        const int type = Doc != nullptr ? Doc->GetRecordType(row) : rec::None;
-        ProcessRecord(type, row, static_cast<int>(index) + 1);
-        if (index + 1 == count && type != rec::Stn && PendingStn) {
-            if (DummyStn(*PendingStn)) {
-                PendingStn.reset();
+        const std::string_view row = RowAsRead(rowAt(index, text), normalised);
+        if (row == std::string_view("##########ADJUSTED-POINTS")) TravFlag = 1;
+        const int type = Doc != nullptr ? Doc->GetRecordTypeUtf8(row) : rec::None;
+        ReadRecord(type, row, static_cast<int>(index) + 1);
+        if (index + 1 == count && type != rec::Stn && CurStnPending) {
+            if (DummyStn(*CurStn)) {
+                Setups.pop_back();  // the station in hand is always the last one made
                 CurStn = nullptr;
             } else {
-                InsertStn(std::move(PendingStn), 0);
+                InsertStn(CurStn, 0);
             }
+            CurStnPending = false;
         }
     }
     TravFlag = 0;
+    Filing = false;
+    // What a repeated observation needed to find its target is not needed after the pass.
+    FiledBackSights = std::vector<FiledTarget>();
+    FiledSideShots = std::vector<FiledTarget>();
     return 1;
 }
 
 const std::wstring& UNeditDatabase::GetValue(int id) const {
-    static const std::wstring kNone;
-    const auto found = Fields.find(id);
-    if (found != Fields.end() && !found->second.empty()) return found->second;
-    return Doc != nullptr ? Doc->GetCurrentValue(id) : kNone;
+    ValueText = Value(id).WideText();
+    return ValueText;
 }
 
-const std::wstring& UNeditDatabase::OwnValue(int id) const {
-    static const std::wstring kNone;
-    const auto found = Fields.find(id);
-    return found == Fields.end() ? kNone : found->second;
+RecordValue UNeditDatabase::Value(int id) const {
+    const RecordValue* own = Fields.find(id);
+    if (own != nullptr && !own->empty()) return *own;
+    return Doc != nullptr ? Doc->CurrentValueOf(id) : RecordValue();
+}
+
+RecordValue UNeditDatabase::OwnValue(int id) const {
+    const RecordValue* own = Fields.find(id);
+    return own == nullptr ? RecordValue() : *own;
+}
+
+NameId UNeditDatabase::NameOf(const RecordValue& value) {
+    if (value.converted) return Names.Intern(value.WideText());
+    nedit::FromUtf8(value.text, NameBuffer);
+    return Names.Intern(NameBuffer);
+}
+
+NameId UNeditDatabase::CodeOf(const RecordValue& value) {
+    if (value.converted) return Codes.Intern(value.WideText());
+    nedit::FromUtf8(value.text, NameBuffer);
+    return Codes.Intern(NameBuffer);
 }
 
 int UNeditDatabase::ProcessRecord(int type, const std::wstring& row, int recordNo) {
+    const std::string text = nedit::ToUtf8(row);
+    return ReadRecord(type, text, recordNo);
+}
+
+int UNeditDatabase::ReadRecord(int type, std::string_view row, int recordNo) {
     if (type == rec::None || Doc == nullptr) return 0;
-    if (!Doc->ProcessRecord(type, row, Fields)) return 0;
+    if (!Doc->ReadRecord(type, row, Fields)) return 0;
     switch (type) {
         case rec::Date:
-            DateText = nedit::TrimChars(nedit::Trim(GetValue(rec::Date)), L",");
+            DateText = nedit::TrimChars(nedit::Trim(Value(rec::Date).WideText()), L",");
             return 1;
         case rec::Unit:
         case rec::Unit2:
-            LengthUnit = FirstLetter(GetValue(fld::UL), LengthUnit);
-            AngleUnit = FirstLetter(GetValue(fld::UA), AngleUnit);
+            LengthUnit = FirstLetter(Value(fld::UL), LengthUnit);
+            AngleUnit = FirstLetter(Value(fld::UA), AngleUnit);
             if (CurStn) {
                 CurStn->LengthUnit = LengthUnit;
                 CurStn->AngleUnit = AngleUnit;
             }
             return 1;
         case rec::Amode:
-            HMode = FirstLetter(GetValue(fld::HMode), HMode);
-            VMode = FirstLetter(GetValue(fld::VMode), VMode);
+            HMode = FirstLetter(Value(fld::HMode), HMode);
+            VMode = FirstLetter(Value(fld::VMode), VMode);
             if (CurStn) {
                 CurStn->HMode = HMode;
                 CurStn->VMode = VMode;
             }
             return 1;
         case rec::Acorr:
-            HCorr = Number(GetValue(fld::HCorr));
-            VCorr = Number(GetValue(fld::VCorr));
+            HCorr = Number(fld::HCorr);
+            VCorr = Number(fld::VCorr);
             return 1;
         case rec::Swing: {
-            const double swing = Number(GetValue(rec::Swing));
+            const double swing = Number(rec::Swing);
             if (!CurStn) {
                 FirstSwing = swing;
             } else if (CurStn->SwingOpen) {
@@ -168,12 +184,11 @@ int UNeditDatabase::ProcessRecord(int type, const std::wstring& row, int recordN
             ProcessBkbRecord();
             return 1;
         case rec::Xyz: {
-            std::wstring id = OwnValue(fld::ID);
-            if (id.empty() && CurStn) id = CurStn->StnName;
-            if (!id.empty()) {
-                KnownCoordMap[id] = {Number(GetValue(fld::E)), Number(GetValue(fld::N)),
-                                     Number(GetValue(fld::H))};
-            }
+            const RecordValue id = OwnValue(fld::ID);
+            NameId name = id.empty() ? kNoName : NameOf(id);
+            if (name == kNoName && CurStn) name = CurStn->Name;
+            if (name != kNoName)
+                KnownCoordMap[name] = {Number(fld::E), Number(fld::N), Number(fld::H)};
             return 1;
         }
         case rec::Bs:
@@ -183,37 +198,37 @@ int UNeditDatabase::ProcessRecord(int type, const std::wstring& row, int recordN
             return 1;
         case rec::Offset:
             if (CurSS != nullptr) {
-                CurSS->OffsetAlong = Number(GetValue(fld::OffsetAlong));
-                CurSS->OffsetRight = Number(GetValue(fld::OffsetRight));
-                CurSS->OffsetUp = Number(GetValue(fld::OffsetUp));
+                CurSS->OffsetAlong = Number(fld::OffsetAlong);
+                CurSS->OffsetRight = Number(fld::OffsetRight);
+                CurSS->OffsetUp = Number(fld::OffsetUp);
             }
             return 1;
         case rec::Insht:
-            CurInstHt = Number(GetValue(rec::Insht));
+            CurInstHt = Number(rec::Insht);
             if (CurStn && CurStn->HtInst < kNoInstrumentHeight) CurStn->HtInst = CurInstHt;
             return 1;
         case rec::Targetht:
         case rec::Targetht2:
-            Doc->SetCurrentValue(Doc->GetFieldId(type), GetValue(type));
+            Doc->SetCurrentValue(Doc->GetFieldId(type), Value(type));
             return 1;
         case rec::Scale: {
             ScaleFactor = 1.0;
-            const double scale = Number(GetValue(rec::Scale));
+            const double scale = Number(rec::Scale);
             if (!Is_Zero(scale, false)) {
                 ScaleFactor = scale;
-                if (CurStn) StnScaleMap[CurStn->StnName] = scale;
+                if (CurStn) StnScaleMap[CurStn->Name] = scale;
             }
             return 1;
         }
         case rec::Radius:
-            EarthRadius = Number(GetValue(rec::Radius));
+            EarthRadius = Number(rec::Radius);
             return 1;
         case rec::Dcorr:
-            Refraction = Number(GetValue(rec::Dcorr));
+            Refraction = Number(rec::Dcorr);
             CorrectDist = true;
             return 1;
         case rec::Prism:
-            PrismConst = Number(GetValue(rec::Prism));
+            PrismConst = Number(rec::Prism);
             return 1;
         default:
             return 0;
@@ -221,63 +236,92 @@ int UNeditDatabase::ProcessRecord(int type, const std::wstring& row, int recordN
 }
 
 void UNeditDatabase::ProcessPtRecord() {
-    const std::wstring id = OwnValue(fld::ID);
+    const RecordValue id = OwnValue(fld::ID);
     if (id.empty()) return;
-    SavePoint(id, Number(GetValue(fld::E)), Number(GetValue(fld::N)), Number(GetValue(fld::H)),
-              OwnValue(fld::CO), 1, kSaveFromPTRecord, 0);
+    const NameId name = NameOf(id);
+    const std::wstring code = OwnValue(fld::CO).WideText();
+    SavePointOf(name, Number(fld::E), Number(fld::N), Number(fld::H), code, kSaveFromPTRecord, 0);
     if (!CurPtNames) CurPtNames = std::make_unique<std::vector<std::wstring>>();
-    if (CurPtNames->empty() || !nedit::EqualsIgnoreCase(CurPtNames->back(), id)) {
-        CurPtNames->push_back(id);
+    const std::wstring_view text = Names.Name(name);
+    if (CurPtNames->empty() || !nedit::EqualsIgnoreCase(CurPtNames->back(), text)) {
+        CurPtNames->emplace_back(text);
     }
 }
 
+STNSTRUCT& UNeditDatabase::NewSetup() {
+    STNSTRUCT& station = Setups.emplace_back();
+    station.Place = static_cast<std::uint32_t>(Setups.size() - 1);
+    return station;
+}
+
+SSSTRUCT& UNeditDatabase::NewTarget() {
+    return Targets.emplace_back();
+}
+
+MeasurementList* UNeditDatabase::NewMeasurements() {
+    return &Measurements.emplace_back();
+}
+
 void UNeditDatabase::ProcessStnRecord() {
-    const std::wstring id = OwnValue(fld::ID);
+    const RecordValue id = OwnValue(fld::ID);
     if (id.empty()) return;
-    auto station = std::make_unique<STNSTRUCT>();
-    station->StnName = id;
-    station->HtInst = Number(GetValue(fld::HI));
-    if (station->HtInst < kNoInstrumentHeight) station->HtInst = CurInstHt;
-    station->StnCode = OwnValue(fld::CO);
-    station->Swing = FirstSwing;
+    // The station in hand is the last one made: a new one goes behind it.
+    STNSTRUCT* pending = CurStnPending ? CurStn : nullptr;
+    STNSTRUCT& station = NewSetup();
+    station.Name = NameOf(id);
+    station.StnName = Names.Name(station.Name);
+    station.HtInst = Number(fld::HI);
+    if (station.HtInst < kNoInstrumentHeight) station.HtInst = CurInstHt;
+    const RecordValue code = OwnValue(fld::CO);
+    if (!code.empty()) station.StnCode = Codes.Name(CodeOf(code));
+    station.Swing = FirstSwing;
     CurSwing = 0.0;
     if (CurPtNames) {
-        station->PtNames = std::move(*CurPtNames);
+        station.PtNames = std::move(*CurPtNames);
         CurPtNames.reset();
     }
-    if (PendingStn) {
-        if (DummyStn(*PendingStn)) {
+    if (pending != nullptr) {
+        if (DummyStn(*pending)) {
             // A station with nothing observed is dropped; the points named before it move on.
-            AppendNames(station->PtNames, PendingStn->PtNames);
+            SparseList<std::wstring> names = std::move(station.PtNames);
+            names.append(pending->PtNames);
+            STNSTRUCT kept = std::move(station);
+            kept.PtNames = std::move(names);
+            kept.Place = pending->Place;
+            Setups.pop_back();
+            Setups.pop_back();
+            Setups.push_back(std::move(kept));
         } else {
             if (CurChkList) {
-                PendingStn->ChkShots = std::move(*CurChkList);
+                pending->ChkShots = std::move(*CurChkList);
                 CurChkList.reset();
             }
-            InsertStn(std::move(PendingStn), 0);
+            InsertStn(pending, 0);
         }
     }
-    PendingStn = std::move(station);
-    CurStn = PendingStn.get();
+    CurStn = &Setups.back();
+    CurStnPending = true;
+    ++StationsOpened;
     CurSS = nullptr;
 }
 
 void UNeditDatabase::ProcessBkbRecord() {
     if (!CurStn) return;
-    CurStn->BkStnName = OwnValue(fld::ID);
+    const RecordValue back = OwnValue(fld::ID);
+    CurStn->BkStnName = back.empty() ? std::wstring_view() : Names.Name(NameOf(back));
     CurStn->BkStnGiven = 1;
     // Whether a bearing or a reading was given is the record's own business: an empty field
     // here means "none", not the value of an earlier record.
-    const std::wstring& bearing = OwnValue(fld::BkBearing);
+    const RecordValue bearing = OwnValue(fld::BkBearing);
     if (bearing.empty()) {
         CurStn->BkBearingGiven = 0;
     } else {
-        CurStn->BkBearing = Number(bearing);
+        CurStn->BkBearing = bearing.Number();
         CurStn->BkBearingGiven = 1;
     }
-    const std::wstring& reading = OwnValue(fld::HA);
+    const RecordValue reading = OwnValue(fld::HA);
     if (!reading.empty()) {
-        CurStn->BkAngle = UAngle::ValidateData(Number(reading) + HCorr);
+        CurStn->BkAngle = UAngle::ValidateData(reading.Number() + HCorr);
     } else if (HMode == L'B' && CurStn->BkBearingGiven) {
         CurStn->BkAngle = CurStn->BkBearing;
     }
@@ -285,23 +329,24 @@ void UNeditDatabase::ProcessBkbRecord() {
 
 void UNeditDatabase::ProcessObservation(int type, int recordNo) {
     if (!CurStn) return;
-    auto target = std::make_unique<SSSTRUCT>();
-    target->SSName = OwnValue(fld::ID);
-    target->SSCode = OwnValue(fld::CO);
-    target->Stn = CurStn;
-    target->RecordNo = recordNo;
+    SSSTRUCT target;
+    const RecordValue id = OwnValue(fld::ID);
+    target.Name = NameOf(id);
+    target.SSName = Names.Name(target.Name);
+    const RecordValue code = OwnValue(fld::CO);
+    if (!code.empty()) target.SSCode = Codes.Name(CodeOf(code));
+    target.Stn = CurStn;
+    target.RecordNo = recordNo;
 
     MEASSTRUCT measurement;
-    measurement.HAng = UAngle::ValidateData(Number(GetValue(fld::HA)) + CurStn->Swing + HCorr);
+    measurement.HAng = UAngle::ValidateData(Number(fld::HA) + CurStn->Swing + HCorr);
     CurStn->SwingOpen = false;
-    measurement.VAng = Doc->ConvertToZenithVA(Number(GetValue(fld::VA))) + VCorr;
-    measurement.SDist = Number(GetValue(fld::SD)) * GetStnScaleFactor(CurStn->StnName);
+    measurement.VAng = Doc->ConvertToZenithVA(Number(fld::VA)) + VCorr;
+    measurement.SDist = Number(fld::SD) * StnScaleFactor(CurStn->Name);
     if (CorrectDist && measurement.SDist >= 1e-40) ApplyDistanceCorrection(measurement);
-    measurement.HtTarget = Number(GetValue(fld::HT));
+    measurement.HtTarget = Number(fld::HT);
 
-    SSSTRUCT* inserted = target.get();
-    CurSS = inserted;
-    InsertSSMS(std::move(target), measurement, type == rec::Bs);
+    InsertSSMS(target, measurement, type == rec::Bs);
     if (type == rec::Bs) {
         CurStn->BkStnGiven = 1;
         return;
@@ -309,11 +354,11 @@ void UNeditDatabase::ProcessObservation(int type, int recordNo) {
     // A target observed again already holds the names filed before its first observation:
     // the names filed since then join them.
     if (CurPtNames) {
-        AppendNames(inserted->PtNames, *CurPtNames);
+        AppendNames(CurSS->PtNames, *CurPtNames);
         CurPtNames.reset();
     }
     if (CurChkList) {
-        if (inserted->ChkShots.empty()) inserted->ChkShots = std::move(*CurChkList);
+        if (CurSS->ChkShots.empty()) CurSS->ChkShots = std::move(*CurChkList);
         CurChkList.reset();
     }
 }
@@ -352,54 +397,93 @@ void UNeditDatabase::ApplyDistanceCorrection(MEASSTRUCT& measurement) const {
     measurement.VAng = angle * kRadToDeg;
 }
 
-int UNeditDatabase::InsertStn(std::unique_ptr<STNSTRUCT> station, int makeCurrent) {
+int UNeditDatabase::InsertStn(STNSTRUCT* station, int makeCurrent) {
     station->HMode = HMode;
     station->VMode = VMode;
     station->AngleUnit = AngleUnit;
     station->LengthUnit = LengthUnit;
-    STNSTRUCT* inserted = station.get();
-    AppendStation(std::move(station));
-    if (makeCurrent) CurStn = inserted;
+    AppendSetup(*station);
+    if (makeCurrent) CurStn = station;
     return 1;
 }
 
-void UNeditDatabase::AppendStation(std::unique_ptr<STNSTRUCT> station) {
-    STNSTRUCT* added = station.get();
-    Stations.push_back(std::move(station));
-    const std::size_t first = StationsByName.Find(added->StnName);
-    if (first == NameIndex::npos) {
-        StationsByName.Set(added->StnName, Stations.size() - 1);
-        return;
+void UNeditDatabase::AppendNode(std::uint32_t ref, NameId name) {
+    const auto node = static_cast<std::uint32_t>(Nodes.size());
+    Nodes.push_back({ref, NodeEntry::kNone});
+    if (name >= FirstNodeOfName.size()) {
+        FirstNodeOfName.resize(std::max<std::size_t>(name + 1, Names.size()), NodeEntry::kNone);
+        LastNodeOfName.resize(FirstNodeOfName.size(), NodeEntry::kNone);
     }
-    STNSTRUCT* head = Stations[first].get();
-    (head->LastSameName != nullptr ? head->LastSameName : head)->NextSameName = added;
-    head->LastSameName = added;
+    if (FirstNodeOfName[name] == NodeEntry::kNone) {
+        FirstNodeOfName[name] = node;
+    } else {
+        Nodes[LastNodeOfName[name]].NextSameName = node;
+    }
+    LastNodeOfName[name] = node;
 }
 
-STNSTRUCT* UNeditDatabase::FirstNamed(const std::wstring& name) const {
-    const std::size_t first = StationsByName.Find(name);
-    return first == NameIndex::npos ? nullptr : Stations[first].get();
+void UNeditDatabase::AppendSetup(STNSTRUCT& station) {
+    AppendNode(station.Place, station.Name);
 }
 
-int UNeditDatabase::InsertSSMS(std::unique_ptr<SSSTRUCT> target, const MEASSTRUCT& measurement,
+void UNeditDatabase::AppendPointNode(NameId name, double e, double n, double z, NameId code) {
+    PointNode point;
+    point.Name = name;
+    point.Code = code;
+    point.East = e;
+    point.North = n;
+    point.Height = z;
+    point.HMode = HMode;
+    point.VMode = VMode;
+    point.AngleUnit = AngleUnit;
+    point.LengthUnit = LengthUnit;
+    AppendNode(static_cast<std::uint32_t>(PointNodes.size()) | NodeEntry::kPointOnly, name);
+    PointNodes.push_back(point);
+}
+
+std::uint32_t UNeditDatabase::FirstNodeOf(NameId name) const {
+    return name < FirstNodeOfName.size() ? FirstNodeOfName[name] : NodeEntry::kNone;
+}
+
+STNSTRUCT* UNeditDatabase::FirstSetupOf(NameId name) const {
+    for (std::uint32_t node = FirstNodeOf(name); node != NodeEntry::kNone;
+         node = Nodes[node].NextSameName) {
+        if (!Nodes[node].IsPointOnly()) return const_cast<STNSTRUCT*>(&Setups[Nodes[node].Index()]);
+    }
+    return nullptr;
+}
+
+int UNeditDatabase::InsertSSMS(const SSSTRUCT& target, const MEASSTRUCT& measurement,
                                int isBackSight) {
     if (CurStn == nullptr) return 0;
     TargetList& list = isBackSight ? CurStn->BSList : CurStn->SSList;
-    SSSTRUCT* existing = list.Find(target->SSName);
+    std::vector<FiledTarget>& filed = isBackSight ? FiledBackSights : FiledSideShots;
+    if (target.Name >= filed.size())
+        filed.resize(std::max<std::size_t>(target.Name + 1, Names.size()));
+    FiledTarget& place = filed[target.Name];
+    // While the rows are read every target of the station in hand is filed; otherwise its
+    // list is searched.
+    SSSTRUCT* existing = place.Station == StationsOpened ? place.Target : nullptr;
+    if (existing == nullptr && !Filing) existing = list.Find(target.SSName);
     if (existing == nullptr) {
-        target->Meas->push_back(measurement);
-        list.Append(std::move(target));
+        SSSTRUCT& added = NewTarget();
+        added = target;
+        added.Meas = NewMeasurements();
+        added.Meas->push_back(measurement);
+        list.Append(&added);
+        place = {StationsOpened, &added};
+        CurSS = &added;
         return 1;
     }
-    // A further observation of the same name: the new node takes the old one's place and its
-    // measurements, so the code and record number are those of the latest observation.
-    target->Meas = existing->Meas;
-    target->Meas->push_back(measurement);
-    // Check shots and point names filed before the old observation stay with the target.
-    target->ChkShots = std::move(existing->ChkShots);
-    target->PtNames = std::move(existing->PtNames);
-    if (CurSS == existing) CurSS = target.get();
-    list.Replace(existing, std::move(target));
+    // A further observation of the same name takes the place of the one before: its code and
+    // record number are those of the latest observation, its offsets none yet, and it keeps
+    // the measurements, the check shots and the point names filed before.
+    existing->SSCode = target.SSCode;
+    existing->RecordNo = target.RecordNo;
+    existing->OffsetAlong = existing->OffsetUp = existing->OffsetRight = 0.0;
+    existing->Meas->push_back(measurement);
+    place = {StationsOpened, existing};
+    CurSS = existing;
     return 1;
 }
 
@@ -415,63 +499,83 @@ int UNeditDatabase::DummyStn(const STNSTRUCT& station) const {
 
 int UNeditDatabase::AddToFSptr(STNSTRUCT* station, SSSTRUCT* target) {
     if (station->FSList.Find(target->SSName) != nullptr) return 1;
-    auto copy = std::make_unique<SSSTRUCT>();
-    CopySS(*target, *copy);  // the copy shares the side shot's measurements
-    // What was filed before the side shot stays with it; its forward copy carries none.
-    copy->PtNames.clear();
-    copy->ChkShots.clear();
-    station->FSList.Append(std::move(copy));
+    AppendForward(*station, *target);
     return 1;
+}
+
+void UNeditDatabase::AppendForward(STNSTRUCT& station, const SSSTRUCT& target) {
+    SSSTRUCT& copy = NewTarget();
+    CopySS(target, copy);  // the copy shares the side shot's measurements
+    // What was filed before the side shot stays with it; its forward copy carries none.
+    copy.PtNames.clear();
+    copy.ChkShots.clear();
+    station.FSList.Append(&copy);
 }
 
 int UNeditDatabase::AddReverseFSptr(STNSTRUCT* station, SSSTRUCT* target) {
-    auto reverse = std::make_unique<STNSTRUCT>();
-    reverse->StnName = target->SSName;
-    reverse->ReverseStn = 1;
-    reverse->HMode = HMode;
-    reverse->VMode = VMode;
-    reverse->AngleUnit = AngleUnit;
-    reverse->LengthUnit = LengthUnit;
-    auto back = std::make_unique<SSSTRUCT>();
-    back->SSName = station->StnName;
-    back->Stn = reverse.get();
-    reverse->FSList.Append(std::move(back));
-    AppendStation(std::move(reverse));
+    STNSTRUCT& reverse = NewSetup();
+    reverse.Name = target->Name;
+    reverse.StnName = target->SSName;
+    reverse.ReverseStn = 1;
+    reverse.HMode = HMode;
+    reverse.VMode = VMode;
+    reverse.AngleUnit = AngleUnit;
+    reverse.LengthUnit = LengthUnit;
+    SSSTRUCT& back = NewTarget();
+    back.Name = station->Name;
+    back.SSName = station->StnName;
+    back.Stn = &reverse;
+    back.Meas = NewMeasurements();
+    reverse.FSList.Append(&back);
+    AppendSetup(reverse);
     return 1;
 }
 
-// The occupied stations of that exact name, other than `observer`.
-std::vector<STNSTRUCT*> UNeditDatabase::OccupiedStations(const std::wstring& name,
+// The occupied stations of that name, other than `observer`.
+std::vector<STNSTRUCT*> UNeditDatabase::OccupiedStations(NameId name,
                                                          const STNSTRUCT* observer) const {
     std::vector<STNSTRUCT*> found;
-    for (STNSTRUCT* station = FirstNamed(name); station != nullptr;
-         station = station->NextSameName) {
-        if (!station->PointOnly && !station->ReverseStn && station != observer)
-            found.push_back(station);
+    for (std::uint32_t node = FirstNodeOf(name); node != NodeEntry::kNone;
+         node = Nodes[node].NextSameName) {
+        if (Nodes[node].IsPointOnly()) continue;
+        STNSTRUCT* station = const_cast<STNSTRUCT*>(&Setups[Nodes[node].Index()]);
+        if (!station->ReverseStn && station != observer) found.push_back(station);
     }
     return found;
 }
 
 int UNeditDatabase::PrepareForwardNoBS() {
-    std::size_t steps = Stations.size();
-    for (const auto& station : Stations) steps += station->SSList.size();
+    std::size_t steps = Nodes.size();
+    for (const STNSTRUCT& station : Setups) steps += station.SSList.size();
     std::size_t done = 0;
+    // The forward copies a station holds, by name id, so that each name is copied once.
+    std::vector<std::uint32_t> copied(Names.size(), NodeEntry::kNone);
     // Reverse nodes are appended as the walk goes; they are no set-ups and are passed over.
-    for (std::size_t s = 0; s < Stations.size(); ++s) {
-        STNSTRUCT* station = Stations[s].get();
+    for (std::size_t s = 0; s < Setups.size(); ++s) {
+        STNSTRUCT& station = Setups[s];
         if (AbortRequested()) return 0;
         UpdateProgress(static_cast<unsigned>(100 * ++done / std::max<std::size_t>(steps, 1)),
                        kGeneratingGraphics);
-        if (station->PointOnly || station->ReverseStn) continue;
-        for (std::size_t t = 0; t < station->SSList.size(); ++t) {
-            SSSTRUCT* target = station->SSList.at(t);
+        if (station.PointOnly || station.ReverseStn) continue;
+        for (const SSSTRUCT* forward : station.FSList)
+            copied[forward->Name] = static_cast<std::uint32_t>(s);
+        for (std::size_t t = 0; t < station.SSList.size(); ++t) {
+            SSSTRUCT* target = station.SSList.at(t);
             UpdateProgress(static_cast<unsigned>(100 * ++done / std::max<std::size_t>(steps, 1)),
                            kGeneratingGraphics);
             if (target->SkipMean) continue;
-            for (STNSTRUCT* sighted : OccupiedStations(target->SSName, station)) {
-                sighted->Sighted = 1;
-                AddToFSptr(station, target);
-                AddReverseFSptr(station, target);
+            // Reverse nodes of the name join its chain as it is walked; they are passed over.
+            for (std::uint32_t node = FirstNodeOf(target->Name); node != NodeEntry::kNone;
+                 node = Nodes[node].NextSameName) {
+                if (Nodes[node].IsPointOnly()) continue;
+                STNSTRUCT& sighted = Setups[Nodes[node].Index()];
+                if (sighted.ReverseStn || &sighted == &station) continue;
+                sighted.Sighted = 1;
+                if (copied[target->Name] != s) {
+                    AppendForward(station, *target);
+                    copied[target->Name] = static_cast<std::uint32_t>(s);
+                }
+                AddReverseFSptr(&station, target);
                 target->ForwardFlag = 1;
             }
         }
@@ -480,15 +584,15 @@ int UNeditDatabase::PrepareForwardNoBS() {
 }
 
 int UNeditDatabase::PrepareForwardWithBS() {
-    for (std::size_t s = 0; s < Stations.size(); ++s) {
-        STNSTRUCT* station = Stations[s].get();
-        if (station->PointOnly || station->ReverseStn) continue;
-        for (const auto& target : station->SSList) {
+    for (std::size_t s = 0; s < Setups.size(); ++s) {
+        STNSTRUCT& station = Setups[s];
+        if (station.PointOnly || station.ReverseStn) continue;
+        for (SSSTRUCT* target : station.SSList) {
             if (target->SkipMean) continue;
-            for (STNSTRUCT* sighted : OccupiedStations(target->SSName, station)) {
-                if (sighted->BkStnName != station->StnName) continue;
+            for (STNSTRUCT* sighted : OccupiedStations(target->Name, &station)) {
+                if (sighted->BkStnName != station.StnName) continue;
                 sighted->Sighted = 1;
-                AddToFSptr(station, target.get());
+                AddToFSptr(&station, target);
                 target->ForwardFlag = 1;
             }
         }
@@ -497,61 +601,66 @@ int UNeditDatabase::PrepareForwardWithBS() {
 }
 
 int UNeditDatabase::AddForwPtr(const std::wstring& name) {
-    for (const auto& station : Stations) {
-        SSSTRUCT* side_shot = station->SSList.Find(name);
-        if (side_shot != nullptr) AddToFSptr(station.get(), side_shot);
+    for (STNSTRUCT& station : Setups) {
+        SSSTRUCT* side_shot = station.SSList.Find(name);
+        if (side_shot != nullptr) AddToFSptr(&station, side_shot);
     }
     return 1;
 }
 
 int UNeditDatabase::AddNewStn(const std::wstring& name) {
-    auto station = std::make_unique<STNSTRUCT>();
-    station->StnName = name;
-    station->Sighted = 1;
-    AppendStation(std::move(station));
+    STNSTRUCT& station = NewSetup();
+    station.Name = NameOf(name);
+    station.StnName = Names.Name(station.Name);
+    station.Sighted = 1;
+    AppendSetup(station);
     if (Rows == nullptr) return 0;
-    return Rows->AddRecord(Rows->GetItemCount(),
-                           nedit::Format(L"%-10s ID=%s,HI=0.000,CO= ", L"STN", name)) >= 0;
+    return AppendRow(*Rows, nedit::Format(L"%-10s ID=%s,HI=0.000,CO= ", L"STN", name)) >= 0;
 }
 
 int UNeditDatabase::DeleteForwPtr() {
-    for (const auto& station : Stations) station->FSList.Clear();
+    for (STNSTRUCT& station : Setups) station.FSList.Clear();
     return 1;
 }
 
 int UNeditDatabase::DeleteList() {
-    Stations.clear();
-    StationsByName.Clear();
-    PendingStn.reset();
+    Setups.clear();
+    PointNodes.clear();
+    Nodes.clear();
+    FirstNodeOfName.clear();
+    LastNodeOfName.clear();
+    Targets.clear();
+    Measurements.clear();
+    FiledBackSights.clear();
+    FiledSideShots.clear();
     CurStn = nullptr;
+    CurStnPending = false;
     CurSS = nullptr;
     return 1;
 }
 
 int UNeditDatabase::GetListCount(int& stations, int& sideShots, int& forward) const {
-    stations = static_cast<int>(Stations.size());
+    stations = static_cast<int>(Nodes.size());
     sideShots = forward = 0;
-    for (const auto& station : Stations) {
-        sideShots += static_cast<int>(station->SSList.size());
-        forward += static_cast<int>(station->FSList.size());
+    for (const STNSTRUCT& station : Setups) {
+        sideShots += static_cast<int>(station.SSList.size());
+        forward += static_cast<int>(station.FSList.size());
     }
     return stations + sideShots + forward;
 }
 
 STNSTRUCT* UNeditDatabase::searchSTN(const std::wstring& name) const {
-    for (STNSTRUCT* station = FirstNamed(name); station != nullptr;
-         station = station->NextSameName) {
-        if (!station->PointOnly) return station;
-    }
-    return nullptr;
+    return FirstSetupOf(Names.Find(name));
 }
 
 int UNeditDatabase::SearchSTN(const std::wstring& name, std::vector<STNSTRUCT*>& out) const {
     out.clear();
     const std::wstring wanted = nedit::ToUpper(name);
-    for (const auto& station : Stations) {
-        if (!station->PointOnly && nedit::ToUpper(station->StnName) == wanted)
-            out.push_back(station.get());
+    for (const NodeEntry& node : Nodes) {
+        if (node.IsPointOnly()) continue;
+        const STNSTRUCT& station = Setups[node.Index()];
+        if (nedit::ToUpper(station.StnName) == wanted)
+            out.push_back(const_cast<STNSTRUCT*>(&station));
     }
     return static_cast<int>(out.size());
 }
@@ -565,6 +674,11 @@ void UNeditDatabase::InitUnitsAndAngleModes() {
 }
 
 double UNeditDatabase::GetStnScaleFactor(const std::wstring& name) const {
-    const auto found = StnScaleMap.find(name);
+    return StnScaleFactor(Names.Find(name));
+}
+
+double UNeditDatabase::StnScaleFactor(NameId station) const {
+    if (StnScaleMap.empty()) return ScaleFactor;
+    const auto found = StnScaleMap.find(station);
     return found == StnScaleMap.end() ? ScaleFactor : found->second;
 }

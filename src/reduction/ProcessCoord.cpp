@@ -75,18 +75,18 @@ void UNeditDatabase::ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target,
 int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
                                  std::vector<std::wstring>* records) {
     StationWork work;
-    work.Steps = 0;
-    for (const auto& station : Stations)
-        work.Steps += 1 + station->SSList.size() + station->FSList.size();
+    work.Steps = Nodes.size();
+    for (const STNSTRUCT& station : Setups)
+        work.Steps += station.SSList.size() + station.FSList.size();
     if (work.Steps == 0) work.Steps = 1;
 
     const bool printing = Report != nullptr && report == 1;
     if (printing) PrintRunHead();
 
     bool aborted = false;
-    // setCoord appends point-only nodes as the walk goes; they are passed over.
-    for (std::size_t s = 0; s < Stations.size() && !aborted; ++s) {
-        STNSTRUCT& station = *Stations[s];
+    // Point-only nodes, which setCoord appends as the walk goes, are passed over.
+    for (std::size_t s = 0; s < Setups.size() && !aborted; ++s) {
+        STNSTRUCT& station = Setups[s];
         if (AbortRequested()) {
             aborted = true;
             break;
@@ -120,14 +120,17 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
         if (position == kPositionFound) {
             double be = 0.0, bn = 0.0, bz = kNoHeight;
             std::wstring back_code;
-            if (findCoord(station.BkStnName, be, bn, bz, back_code, report, true) &&
+            if (FindCoordOf(NameOf(station.BkStnName), be, bn, bz, back_code, report, true) &&
                 Report != nullptr) {
                 double distance = 0.0;
                 nedit::geo_brgdst(work.StnE, work.StnN, be, bn, &work.BackBearing, &distance);
             }
         }
-        const double stored = GetBearingFromArray(station.StnName, station.BkStnName);
-        if (stored >= 0.0) work.BackBearing = stored;
+        if (!LineBearings.empty()) {
+            const double stored =
+                GetBearingFromArray(std::wstring(station.StnName), std::wstring(station.BkStnName));
+            if (stored >= 0.0) work.BackBearing = stored;
+        }
 
         work.HasShots = HaveSideshotsToReport(&station, records);
         work.HeadPrinted = false;
@@ -149,37 +152,38 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
 
 int UNeditDatabase::OrientByCoordinates(STNSTRUCT& station, StationWork& work) {
     if (!station.CoordKnown) {
-        std::wstring code = station.StnCode;
-        if (findCoord(station.StnName, station.East, station.North, station.Height, code, 0,
-                      true) ||
-            GetPointFromPtList(station.StnName, station.East, station.North, station.Height, code,
-                               1)) {
-            station.StnCode = code;
-        } else if (FindXYZ(station.StnName, station.East, station.North, station.Height) >= 0) {
+        std::wstring code(station.StnCode);
+        if (FindCoordOf(station.Name, station.East, station.North, station.Height, code, 0, true) ||
+            PointFromPtList(station.Name, station.East, station.North, station.Height, code, 1)) {
+            station.StnCode = Codes.Name(CodeOf(code));
+        } else if (FindXYZ(std::wstring(station.StnName), station.East, station.North,
+                           station.Height) >= 0) {
             station.CoordKnown = 1;
         } else {
             UCoordEntryDlg dialog(
                 CoordsOrderXY() ? UCoordEntryDlg::kEastFirstId : UCoordEntryDlg::kNorthFirstId,
                 Host);
-            if (dialog.process(station.StnName, UseForAll) != 1) return 0;
+            if (dialog.process(std::wstring(station.StnName), UseForAll) != 1) return 0;
             station.East = dialog.getEast();
             station.North = dialog.getNorth();
             station.Height = dialog.getZ();
-            station.StnCode = dialog.getCode();
+            station.StnCode = Codes.Name(CodeOf(dialog.getCode()));
             station.CoordKnown = 1;
         }
     }
     const UWPoint here(station.East, station.North, station.Height);
     double be = 0.0, bn = 0.0, bz = kNoHeight;
     std::wstring back_code;
-    bool found = findCoord(station.BkStnName, be, bn, bz, back_code, 0, true) != 0;
+    const NameId back = NameOf(station.BkStnName);
+    bool found = FindCoordOf(back, be, bn, bz, back_code, 0, true) != 0;
     if (!found) {
-        const UNeditPt* point = SearchPt(station.BkStnName);
-        if (point != nullptr) {
-            be = point->x;
-            bn = point->y;
-            bz = point->z;
-            found = !point->IsPTRecord();
+        const int point = PointOf(back);
+        if (point >= 0) {
+            const UNeditPt& known = PointList[static_cast<std::size_t>(point)];
+            be = known.x;
+            bn = known.y;
+            bz = known.z;
+            found = !known.IsPTRecord();
         }
     }
     if (found) {
@@ -193,29 +197,29 @@ int UNeditDatabase::OrientByCoordinates(STNSTRUCT& station, StationWork& work) {
 
 void UNeditDatabase::AskBackStation(const STNSTRUCT& station, StationWork& work,
                                     const UWPoint& here) {
-    UBKBCoordDlg dialog(station.BkStnName);
+    const std::wstring back(station.BkStnName);
+    UBKBCoordDlg dialog(back);
     // The dialog has OK only: whatever stands in its fields is taken.
     if (Host != nullptr) Host->Run(dialog);
     if (dialog.ApplyBearing) {
         work.BackBearing = dialog.Bearing;
-        const int row = FindRecord(rec::Bkb, station.BkStnName);
+        const int row = FindRecord(rec::Bkb, back);
         if (row >= 0) {
-            ReplaceRow(row, FormatBKBRecord(station.BkStnName,
-                                            station.BkAngle - FirstSwing - CurSwing - HCorr,
-                                            dialog.Bearing));
+            ReplaceRow(*Rows, row,
+                       FormatBKBRecord(back, station.BkAngle - FirstSwing - CurSwing - HCorr,
+                                       dialog.Bearing));
         }
         return;
     }
     work.BackBearing = UWLine(here, UWPoint(dialog.East, dialog.North, dialog.Height)).Bearing();
-    const std::wstring text =
-        FormatXYZRecord(station.BkStnName, dialog.East, dialog.North, dialog.Height);
+    const std::wstring text = FormatXYZRecord(back, dialog.East, dialog.North, dialog.Height);
     double e = 0.0, n = 0.0, z = 0.0;
-    const int row = FindXYZ(station.BkStnName, e, n, z);
+    const int row = FindXYZ(back, e, n, z);
     if (row < 0) {
-        if (Rows != nullptr) Rows->AddRecord(Rows->GetItemCount(), text);
+        if (Rows != nullptr) AppendRow(*Rows, text);
     } else if (!Is_Zero(e - dialog.East, false) || !Is_Zero(n - dialog.North, false) ||
                !Is_Zero(z - dialog.Height, false)) {
-        ReplaceRow(row, text);
+        ReplaceRow(*Rows, row, text);
     }
 }
 
@@ -224,7 +228,7 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
     work.StnE = work.StnN = 0.0;
     work.StnZ = kNoHeight;
     work.StnCodeOut.clear();
-    const std::wstring& name = station.StnName;
+    const NameId name = station.Name;
     auto take_node = [&]() {
         work.StnE = station.East;
         work.StnN = station.North;
@@ -233,14 +237,14 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
     // The user is asked when nothing else knows the station; no answer ends the run.
     auto ask_user = [&](int fix) {
         double e = 0.0, n = 0.0, z = kNoHeight;
-        if (!getCoord(name, &e, &n, &z, work.StnCodeOut, 1, true)) {
+        if (!GetCoordOf(name, &e, &n, &z, work.StnCodeOut, 1, true)) {
             ErrorCode = 1;
             UpdateProgress(100, L"");
             return false;
         }
-        setCoord(name, e, n, z, work.StnCodeOut, kSetCoordOverwrite, fix, 1);
+        SetCoordOf(name, e, n, z, work.StnCodeOut, kSetCoordOverwrite, fix, 1);
         station.CoordKnown = 1;
-        SaveTravPoint(name, e, n, z, work.StnCodeOut, 1);
+        SaveTravPoint(std::wstring(station.StnName), e, n, z, work.StnCodeOut, 1);
         work.StnE = e;
         work.StnN = n;
         work.StnZ = z;
@@ -254,13 +258,14 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
     if (station.CoordKnown) {
         if (fixedOnly) return kStationLeftOut;
         take_node();
-        setCoord(name, work.StnE, work.StnN, work.StnZ, station.StnCode, kSetCoordOverwrite, report,
-                 1);
-        SaveTravPoint(name, work.StnE, work.StnN, work.StnZ, station.StnCode, 1);
+        SetCoordOf(name, work.StnE, work.StnN, work.StnZ, station.StnCode, kSetCoordOverwrite,
+                   report, 1);
+        SaveTravPoint(std::wstring(station.StnName), work.StnE, work.StnN, work.StnZ,
+                      std::wstring(station.StnCode), 1);
         return kPositionFound;
     }
     double e = 0.0, n = 0.0, z = kNoHeight;
-    if (findCoord(name, e, n, z, work.StnCodeOut, report, true)) {
+    if (FindCoordOf(name, e, n, z, work.StnCodeOut, report, true)) {
         station.East = e;
         station.North = n;
         station.Height = z;
@@ -272,11 +277,12 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
         if (fixedOnly) return kStationLeftOut;
         return ask_user(report) ? kPositionFound : kPositionFailed;
     }
-    const UNeditPt* point = SearchPt(name);
-    if (point != nullptr) {
-        work.StnE = point->x;
-        work.StnN = point->y;
-        work.StnZ = point->z;
+    const int point = PointOf(name);
+    if (point >= 0) {
+        const UNeditPt& known = PointList[static_cast<std::size_t>(point)];
+        work.StnE = known.x;
+        work.StnN = known.y;
+        work.StnZ = known.z;
         work.StnCodeOut.clear();
         return kPositionNotFound;
     }
@@ -284,7 +290,7 @@ int UNeditDatabase::PositionStation(STNSTRUCT& station, StationWork& work, int r
 }
 
 int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int report) {
-    const int from = GetPointIdx(station.StnName);
+    const int from = PointOf(station.Name);
     for (std::size_t t = 0; t < station.FSList.size(); ++t) {
         SSSTRUCT& target = *station.FSList.at(t);
         if (!work.HeadPrinted && Report != nullptr && report == 1) {
@@ -294,8 +300,8 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
         if (AbortRequested()) return 0;
         UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps),
                        kGeneratingGraphics);
-        if (GetTravPointIdx(target.SSName) >= 0) {
-            const int to = GetPointIdx(target.SSName);
+        if (!TravPtList.empty() && GetTravPointIdx(std::wstring(target.SSName)) >= 0) {
+            const int to = PointOf(target.Name);
             if (from >= 0 && to >= 0 && from != to)
                 SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 1);
             continue;
@@ -305,9 +311,9 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
         ReduceTarget(station, target, work, e, n, z);
         if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, true);
         if (IsSelfObservation(station, target)) continue;
-        if (searchSTN(target.SSName) != nullptr)
-            setCoord(target.SSName, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
-        const int to = GetPointIdx(target.SSName);
+        if (FirstSetupOf(target.Name) != nullptr)
+            SetCoordOf(target.Name, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
+        const int to = PointOf(target.Name);
         if (from >= 0 && to >= 0 && from != to)
             SaveLine(static_cast<unsigned>(from), static_cast<unsigned>(to), 0);
     }
@@ -329,7 +335,7 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
         ReduceTarget(station, target, work, e, n, z);
         if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, false);
         if (IsSelfObservation(station, target)) continue;
-        setCoord(target.SSName, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
+        SetCoordOf(target.Name, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
     }
     return 1;
 }
@@ -363,11 +369,11 @@ void UNeditDatabase::PrintStationBlock(const STNSTRUCT& station, const StationWo
         for (const MEASSTRUCT& measurement : *station.BSList.front()->Meas)
             back_readings.push_back(measurement.HAng);
     }
-    Report->PrintOccStnBlk(back_readings, station.StnName, work.StnE, work.StnN, work.StnZ,
-                           station.StnCode, station.HtInst, GetStnScaleFactor(station.StnName),
-                           bearing_mode ? std::wstring() : station.BkStnName,
-                           bearing_mode ? 0.0 : work.BackBearing,
-                           bearing_mode ? 0.0 : work.BsReading);
+    Report->PrintOccStnBlk(
+        back_readings, std::wstring(station.StnName), work.StnE, work.StnN, work.StnZ,
+        std::wstring(station.StnCode), station.HtInst, StnScaleFactor(station.Name),
+        bearing_mode ? std::wstring() : std::wstring(station.BkStnName),
+        bearing_mode ? 0.0 : work.BackBearing, bearing_mode ? 0.0 : work.BsReading);
     if (!Is_Zero(station.Swing - FirstSwing, false))
         Report->PrintHeadHDegree(L"Swing", station.Swing, true);
 }
@@ -385,14 +391,15 @@ void UNeditDatabase::PrintTarget(const STNSTRUCT& station, const SSSTRUCT& targe
             0, 1, 0);
     }
     const MeasurementList& measurements = *target.Meas;
+    const std::wstring name(target.SSName);
     if (measurements.size() >= 2) {
         for (const MEASSTRUCT& m : measurements) {
-            Report->PrintSSLine(target.SSName, m.HAng, m.VAng, m.SDist, m.HtTarget, 0.0, 0.0, 0.0,
-                                L"", 0, false);
+            Report->PrintSSLine(name, m.HAng, m.VAng, m.SDist, m.HtTarget, 0.0, 0.0, 0.0, L"", 0,
+                                false);
         }
     }
-    Report->PrintSSLine((measurements.size() >= 2 ? L"*" : L"") + target.SSName, target.HAng,
-                        target.VAng, target.SDist, target.HtTarget, e, n, z, target.SSCode,
+    Report->PrintSSLine((measurements.size() >= 2 ? L"*" : L"") + name, target.HAng, target.VAng,
+                        target.SDist, target.HtTarget, e, n, z, std::wstring(target.SSCode),
                         target.RecordNo, true);
     if (!Is_Zero(target.OffsetAlong, false) || !Is_Zero(target.OffsetRight, false) ||
         !Is_Zero(target.OffsetUp, false)) {

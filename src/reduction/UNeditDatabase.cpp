@@ -9,6 +9,7 @@
 #include "platform/messages/ProgressSink.h"
 #include "platform/messages/Translate.h"
 #include "platform/text/WideText.h"
+#include "records/RecordText.h"
 #include "records/RecordTypes.h"
 #include "records/RowSource.h"
 
@@ -86,10 +87,7 @@ int UNeditDatabase::GetError() {
 }
 
 void UNeditDatabase::InitHeadList() {
-    Stations.clear();
-    StationsByName.Clear();
-    PendingStn.reset();
-    CurStn = nullptr;
+    DeleteList();
 }
 
 void UNeditDatabase::SetMaxMin(const UWRect& extents) {
@@ -160,14 +158,13 @@ void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRo
     if (result != 0 && findRoutes) RunStages(nedit::RunStep::Routes);
 }
 
-std::vector<std::wstring> UNeditDatabase::ContentRows() const {
-    std::vector<std::wstring> rows;
+nedit::TextLines UNeditDatabase::ContentRows() const {
+    nedit::TextLines rows;
     if (Rows == nullptr || Doc == nullptr) return rows;
-    rows.reserve(static_cast<std::size_t>(Rows->GetItemCount()));
+    std::string buffer;
     for (int row = 0; row < Rows->GetItemCount(); ++row) {
-        std::wstring text = nedit::ToUpper(
-            nedit::TrimView(std::wstring_view(Rows->GetItemText(row)).substr(0, kMaxRowLength)));
-        if (IsContentType(Doc->GetRecordType(text))) rows.push_back(std::move(text));
+        const std::string_view text = RowAsRead(Rows->GetRowUtf8(row), buffer);
+        if (IsContentType(Doc->GetRecordTypeUtf8(text))) rows.push_back(text);
     }
     return rows;
 }
@@ -178,15 +175,17 @@ void UNeditDatabase::CreateContent() {
 
 bool UNeditDatabase::IsContentModified() const {
     if (Rows == nullptr || Doc == nullptr) return false;
-    const std::vector<std::wstring> present = ContentRows();
+    const nedit::TextLines present = ContentRows();
     if (present.size() != ContentLines.size()) return true;
     FieldMap stored_fields;
     FieldMap present_fields;
     for (std::size_t i = 0; i < present.size(); ++i) {
-        const int stored_type = Doc->GetRecordType(ContentLines[i]);
-        if (stored_type != Doc->GetRecordType(present[i])) return true;
-        const int stored_parsed = Doc->ProcessRecord(stored_type, ContentLines[i], stored_fields);
-        const int present_parsed = Doc->ProcessRecord(stored_type, present[i], present_fields);
+        const std::wstring stored = nedit::FromUtf8(ContentLines[i]);
+        const std::wstring now = nedit::FromUtf8(present[i]);
+        const int stored_type = Doc->GetRecordType(stored);
+        if (stored_type != Doc->GetRecordType(now)) return true;
+        const int stored_parsed = Doc->ProcessRecord(stored_type, stored, stored_fields);
+        const int present_parsed = Doc->ProcessRecord(stored_type, now, present_fields);
         if (stored_parsed != present_parsed) return true;
         if (!stored_parsed) continue;
         // A field only the present row has does not count; a changed case does not either.
@@ -198,10 +197,4 @@ bool UNeditDatabase::IsContentModified() const {
         }
     }
     return false;
-}
-
-void UNeditDatabase::ReplaceRow(int row, const std::wstring& text) {
-    if (Rows == nullptr) return;
-    Rows->DeleteItem(row);
-    Rows->AddRecord(row, text);
 }

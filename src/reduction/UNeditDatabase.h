@@ -5,10 +5,18 @@
 // stage they belong to: PrepareList.cpp, Averaging.cpp, CoordLookup.cpp, ProcessCoord.cpp,
 // the run in UNeditDatabase.cpp. The stores of reduced geometry are classes of codes/
 // (PointStore, LineStore, ArcStore) which the engine owns and forwards to (EngineStores.cpp).
+//
+// A run stays linear in its rows and lean in memory: every name is given a number once, when
+// its row is read (NameTable), and whatever belongs to a name (its nodes, its point, its
+// coordinate record) is found by that number; nodes live in blocks, not one heap block each;
+// the rows are read as UTF-8 views; and the rows are indexed by name once per run (RowIndex)
+// for the look-ups that once read every row again.
 
+#include <deque>
 #include <functional>
 #include <map>
 #include <memory>
+#include <set>
 #include <string>
 #include <unordered_map>
 #include <vector>
@@ -18,11 +26,15 @@
 #include "codes/PointStore.h"
 #include "platform/geometry/UWCircle.h"
 #include "platform/geometry/UWRect.h"
-#include "platform/text/NameIndex.h"
+#include "platform/text/NameTable.h"
+#include "platform/text/TextLines.h"
+#include "records/RecordFields.h"
 #include "records/UNeutralFileFormat.h"
 #include "reduction/CError.h"
 #include "reduction/ObservationModel.h"
+#include "reduction/RowIndex.h"
 #include "reduction/RunStage.h"
+#include "reduction/StationList.h"
 
 class UNeditReport;
 class USurveyDoc;
@@ -78,7 +90,10 @@ class UNeditDatabase {
 
     void SetOutput(bool output) { Output = output; }
     bool GetOutput() const { return Output; }
-    void SetListCtrlPtr(nedit::RowSource* rows) { Rows = rows; }
+    void SetListCtrlPtr(nedit::RowSource* rows) {
+        Rows = rows;
+        RowIndexes.clear();
+    }
     void SetReportPtr(UNeditReport* report) { Report = report; }
     UNeditReport* GetReport() const { return Report; }
     void SetFileName(const std::wstring& name) { FileName = name; }
@@ -106,9 +121,13 @@ class UNeditDatabase {
     /// The field from the record in hand, or its current value when absent or empty.
     /// Valid until the next record is parsed.
     const std::wstring& GetValue(int id) const;
-    int InsertStn(std::unique_ptr<STNSTRUCT> station, int makeCurrent);
-    int InsertSSMS(std::unique_ptr<SSSTRUCT> target, const MEASSTRUCT& measurement,
-                   int isBackSight);
+    /// Appends `station`, a node of this engine's (the station in hand, or one this engine
+    /// made), to the list, with the current modes and units.
+    int InsertStn(STNSTRUCT* station, int makeCurrent);
+    /// Files `target` with `measurement` under the station in hand: a target of that name in
+    /// the list takes over its code and record number and gains the measurement; a new name
+    /// is appended. 0 without a station in hand.
+    int InsertSSMS(const SSSTRUCT& target, const MEASSTRUCT& measurement, int isBackSight);
     int CopySS(const SSSTRUCT& from, SSSTRUCT& to) const;
     int DummyStn(const STNSTRUCT& station) const;
     int AddToFSptr(STNSTRUCT* station, SSSTRUCT* target);
@@ -127,7 +146,8 @@ class UNeditDatabase {
     void InitUnitsAndAngleModes();
     double GetStnScaleFactor(const std::wstring& name) const;
 
-    const std::vector<std::unique_ptr<STNSTRUCT>>& GetStations() const { return Stations; }
+    /// The station list, point-only nodes included, in its order.
+    StationList GetStations() const { return StationList(Setups, PointNodes, Nodes, Names, Codes); }
     STNSTRUCT* GetCurStn() const { return CurStn; }
     SSSTRUCT* GetCurrentSS() const { return CurSS; }
     wchar_t GetHMode() const { return HMode; }
@@ -252,25 +272,78 @@ class UNeditDatabase {
     bool AbortRequested() const;
     void RunStages(nedit::RunStep step);
     void ResetForRerun();
-    void AppendStation(std::unique_ptr<STNSTRUCT> station);
     void ResetPassValues();
-    int PrepareRows(const std::vector<std::wstring>& rows);
-    /// A field of the record in hand only. Names, codes, and the fields whose emptiness a
-    /// record type gives a meaning to are read so: they do not run down from earlier records.
-    const std::wstring& OwnValue(int id) const;
+    template <typename RowAt>
+    int PrepareRows(std::size_t count, RowAt rowAt);
+    int ReadRecord(int type, std::string_view row, int recordNo);
+    /// The value of a field of the record in hand, or its current value when absent or
+    /// empty; and the record's own value alone (empty when absent), for names, codes and the
+    /// fields whose emptiness a record type gives a meaning to.
+    RecordValue Value(int id) const;
+    RecordValue OwnValue(int id) const;
+    double Number(int id) const { return Value(id).Number(); }
+    /// The id of a name or code given in a record.
+    NameId NameOf(const RecordValue& value);
+    NameId NameOf(std::wstring_view name) { return Names.Intern(name); }
+    /// The same for codes, which have a table of their own: few and often repeated.
+    NameId CodeOf(const RecordValue& value);
+    NameId CodeOf(std::wstring_view code) { return Codes.Intern(code); }
+    std::wstring_view CodeText(NameId id) const {
+        return id == kNoName ? std::wstring_view() : Codes.Name(id);
+    }
     void ProcessPtRecord();
     void ProcessStnRecord();
     void ProcessBkbRecord();
     void ProcessObservation(int type, int recordNo);
     void ApplyDistanceCorrection(MEASSTRUCT& measurement) const;
-    int FindCoordinateRow(const nedit::RowSource* rows, const std::wstring& name, bool coordinates,
-                          int type, double* e, double* n, double* z);
-    void ReplaceRow(int row, const std::wstring& text);
-    /// The first node of that exact name, in list order; the others follow by NextSameName.
-    STNSTRUCT* FirstNamed(const std::wstring& name) const;
-    std::vector<STNSTRUCT*> OccupiedStations(const std::wstring& name,
-                                             const STNSTRUCT* observer) const;
-    std::vector<std::wstring> ContentRows() const;
+    double StnScaleFactor(NameId station) const;
+
+    // The nodes: stations and reverse nodes in Setups, point-only nodes in PointNodes, and
+    // the list's order in Nodes, each entry with the next node of its name.
+    STNSTRUCT& NewSetup();
+    SSSTRUCT& NewTarget();
+    MeasurementList* NewMeasurements();
+    void AppendNode(std::uint32_t ref, NameId name);
+    void AppendSetup(STNSTRUCT& station);
+    void AppendPointNode(NameId name, double e, double n, double z, NameId code);
+    /// The first node of that name in the list, or NodeEntry::kNone.
+    std::uint32_t FirstNodeOf(NameId name) const;
+    STNSTRUCT* FirstSetupOf(NameId name) const;
+    std::vector<STNSTRUCT*> OccupiedStations(NameId name, const STNSTRUCT* observer) const;
+    void AppendForward(STNSTRUCT& station, const SSSTRUCT& target);
+
+    // The coordinate sources by name id (CoordLookup.cpp).
+    int FindCoordOf(NameId name, double& e, double& n, double& z, std::wstring& code, int fix,
+                    bool askUser);
+    int GetCoordOf(NameId name, double* e, double* n, double* z, std::wstring& code, int clear,
+                   bool showDialog);
+    int SetCoordOf(NameId name, double e, double n, double z, std::wstring_view code, int flags,
+                   int fix, int ptFlag);
+    int PointOf(NameId name) const;
+    int PointFromPtList(NameId name, double& e, double& n, double& z, std::wstring& code,
+                        unsigned mode) const;
+    const KnownCoord* KnownCoordOf(NameId name) const;
+    unsigned SavePointOf(NameId name, double x, double y, double z, std::wstring_view code,
+                         unsigned flags, int derived);
+    /// Indexes the point list by name id again, after it was thinned.
+    void IndexPoints();
+    /// The text of a code as the points of that code share it.
+    const std::shared_ptr<const std::wstring>& SharedCode(NameId code);
+
+    // The rows by name (RowIndex), kept true as the engine writes rows. The index of the
+    // coordinate types Xyz and Yxz goes by kCoordinateRows, the others by their type.
+    static constexpr int kCoordinateRows = 0;
+    RowIndex& IndexOf(const nedit::RowSource& rows, int type);
+    /// Indexes of rows other than the engine's own are kept only for one operation.
+    void ForgetOtherRows();
+    int FindCoordinateRow(const nedit::RowSource& rows, const std::wstring& name, int type,
+                          double* e, double* n, double* z);
+    int AppendRow(nedit::RowSource& rows, const std::wstring& text);
+    int InsertRow(nedit::RowSource& rows, int row, const std::wstring& text);
+    void ReplaceRow(nedit::RowSource& rows, int row, const std::wstring& text);
+    void RowsWritten(const nedit::RowSource& rows);
+    nedit::TextLines ContentRows() const;
+
     // Reduction of one station, and of one target with its printing (ProcessCoord.cpp).
     struct StationWork;
     /// Results of PositionStation.
@@ -307,7 +380,9 @@ class UNeditDatabase {
     wchar_t AngleUnit = L'S';
     wchar_t LengthUnit = L'M';
     int TravFlag = 0;
-    FieldMap Fields;
+    RecordFields Fields;             // of the record in hand
+    mutable std::wstring ValueText;  // GetValue's text
+    std::wstring NameBuffer;         // a name on its way into the table
     double ScaleFactor = 1.0;
     double PrismConst = 0.0;
     double FirstSwing = 0.0;
@@ -322,31 +397,52 @@ class UNeditDatabase {
     std::wstring ChkCode;
     bool Output = false;
     int ErrorCode = 0;
-    std::vector<std::wstring> ContentLines;
+    nedit::TextLines ContentLines;
 
-    // The observation model: stations in list order, with a look-up by exact name.
-    std::vector<std::unique_ptr<STNSTRUCT>> Stations;
-    // The first node of each name, by its place in Stations; the others of that name follow
-    // by NextSameName.
-    NameIndex StationsByName{
-        [this](std::size_t i) -> const std::wstring& { return Stations[i]->StnName; }};
-    STNSTRUCT* CurStn = nullptr;            // the station being filled, or the last one of a pass
-    std::unique_ptr<STNSTRUCT> PendingStn;  // owns the station being filled until it joins the list
+    // The observation model. Names and codes keep their ids for the life of the engine.
+    nedit::NameTable Names;
+    nedit::NameTable Codes;
+    std::deque<STNSTRUCT> Setups;
+    std::vector<PointNode> PointNodes;
+    std::vector<NodeEntry> Nodes;
+    std::vector<std::uint32_t> FirstNodeOfName;  // by name id, into Nodes
+    std::vector<std::uint32_t> LastNodeOfName;
+    std::deque<SSSTRUCT> Targets;
+    std::deque<MeasurementList> Measurements;
+    // Where the station in hand filed a target of a name, by name id: the station's number in
+    // the pass and the target; so a repeated observation finds its target at once.
+    struct FiledTarget {
+        std::uint32_t Station = NodeEntry::kNone;
+        SSSTRUCT* Target = nullptr;
+    };
+    std::vector<FiledTarget> FiledBackSights;
+    std::vector<FiledTarget> FiledSideShots;
+    std::uint32_t StationsOpened = 0;
+    bool Filing = false;          // the rows are being read
+    STNSTRUCT* CurStn = nullptr;  // the station being filled, or the last one of a pass
+    bool CurStnPending = false;   // CurStn is not in the list yet
     SSSTRUCT* CurSS = nullptr;
     std::unique_ptr<std::vector<std::wstring>> CurPtNames;
     std::unique_ptr<std::vector<SSCheck>> CurChkList;
-    std::map<std::wstring, KnownCoord> KnownCoordMap;
-    std::map<std::wstring, double> StnScaleMap;
+    std::unordered_map<NameId, KnownCoord> KnownCoordMap;
+    std::unordered_map<NameId, double> StnScaleMap;
 
     // Coordinate sources and the bearing store.
-    std::map<std::wstring, bool> DbCoordNames;
-    std::map<std::wstring, bool> LocalCoordNames;
+    std::set<std::wstring, std::less<>> DbCoordNames;
+    std::set<std::wstring, std::less<>> LocalCoordNames;
     bool UseForAll = false;
     std::vector<ULINEBEAR_STRUCT> LineBearings;
     std::unordered_map<std::wstring, std::size_t> BearingIndex;  // "from\x1fto" as stored
 
-    // Stores of reduced geometry, with look-ups by name.
+    // The rows by name, for the record types looked up in them (one index for Xyz and Yxz).
+    std::map<int, RowIndex> RowIndexes;
+    std::map<int, RowIndex> OtherRowIndexes;  // of rows other than the engine's own
+    const nedit::RowSource* OtherRows = nullptr;
+
+    // Stores of reduced geometry, the points also by name id.
     nedit::PointStore PointList;
+    std::vector<std::int32_t> PointOfName;
+    std::vector<std::shared_ptr<const std::wstring>> CodeTexts;  // by code id
     nedit::PointStore AddPtList;
     nedit::PointStore TravPtList;
     nedit::LineStore LineList;
