@@ -75,8 +75,8 @@ void UListCtrl::DeleteItem(int row) {
     if (InRange(row)) RemoveRows(row, 1);
 }
 
-void UListCtrl::Reserve(std::size_t rows, std::size_t bytes) {
-    rows_.reserve(rows, bytes);
+void UListCtrl::Reserve(std::size_t rows) {
+    rows_.reserve(rows);
     selected_.reserve(rows);
 }
 

@@ -112,8 +112,7 @@ class UListCtrl : public nedit::RowSource {
     void DeleteAllItems() override;
     /// Removes the row; a row that does not exist is left alone.
     void DeleteItem(int row) override;
-    /// Room for `rows` rows of `bytes` bytes in all.
-    void Reserve(std::size_t rows, std::size_t bytes = 0);
+    void Reserve(std::size_t rows);
     /// All rows as wide text, made when asked for and kept until the rows change: for tests
     /// and short lists. Readers of many rows take GetRowUtf8, which copies nothing.
     const std::vector<std::wstring>& GetRows() const;

@@ -4,8 +4,9 @@
 // run builds them afresh from the rows.
 //
 // Nodes live in blocks of the engine (a station, a target, a list of measurements is no heap
-// block of its own), and their names and codes are views into the engine's table of names:
-// a node, a view and a pointer between nodes are good until the engine's next run.
+// block of its own), and their names and codes are NameTexts of the engine's tables, which
+// read as std::wstring_view: a node, a name and a pointer between nodes are good until the
+// engine's next run.
 
 #include <cstdint>
 #include <memory>
@@ -103,8 +104,8 @@ struct SSSTRUCT {
     double OffsetAlong = 0.0;
     double OffsetUp = 0.0;
     double OffsetRight = 0.0;
-    std::wstring_view SSName;
-    std::wstring_view SSCode;
+    nedit::NameText SSName;
+    nedit::NameText SSCode;
     double HAng = 0.0;  // means, face 1
     double VAng = 0.0;
     double SDist = 0.0;
@@ -146,9 +147,9 @@ class TargetList {
 /// shown as one of these where the station list is walked.
 struct STNSTRUCT {
     short Sighted = 0;
-    std::wstring_view StnName;
-    std::wstring_view StnCode;
-    std::wstring_view BkStnName;
+    nedit::NameText StnName;
+    nedit::NameText StnCode;
+    nedit::NameText BkStnName;
     wchar_t HMode = L'A';
     wchar_t VMode = L'Z';
     double HtInst = 0.0;

@@ -308,7 +308,7 @@ void UNeditDatabase::ProcessStnRecord() {
 void UNeditDatabase::ProcessBkbRecord() {
     if (!CurStn) return;
     const RecordValue back = OwnValue(fld::ID);
-    CurStn->BkStnName = back.empty() ? std::wstring_view() : Names.Name(NameOf(back));
+    CurStn->BkStnName = back.empty() ? nedit::NameText() : Names.Name(NameOf(back));
     CurStn->BkStnGiven = 1;
     // Whether a bearing or a reading was given is the record's own business: an empty field
     // here means "none", not the value of an earlier record.
@@ -433,12 +433,17 @@ void UNeditDatabase::AppendPointNode(NameId name, double e, double n, double z, 
     point.East = e;
     point.North = n;
     point.Height = z;
-    point.HMode = HMode;
-    point.VMode = VMode;
-    point.AngleUnit = AngleUnit;
-    point.LengthUnit = LengthUnit;
+    point.Modes = ModesNow();
     AppendNode(static_cast<std::uint32_t>(PointNodes.size()) | NodeEntry::kPointOnly, name);
     PointNodes.push_back(point);
+}
+
+std::uint32_t UNeditDatabase::ModesNow() {
+    const ModeSet now{HMode, VMode, AngleUnit, LengthUnit};
+    const auto found = std::find(ModeSets.begin(), ModeSets.end(), now);
+    if (found != ModeSets.end()) return static_cast<std::uint32_t>(found - ModeSets.begin());
+    ModeSets.push_back(now);
+    return static_cast<std::uint32_t>(ModeSets.size() - 1);
 }
 
 std::uint32_t UNeditDatabase::FirstNodeOf(NameId name) const {

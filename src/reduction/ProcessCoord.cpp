@@ -36,6 +36,9 @@ struct UNeditDatabase::StationWork {
     std::size_t Steps = 1;
     bool HasShots = false;
     bool HeadPrinted = false;
+    /// The blocks of stations and targets are written: there is a report, reporting is on,
+    /// and the report keeps its text (one that keeps none would only throw them away).
+    bool Printing = false;
 };
 
 void UNeditDatabase::geo_coord(double e, double n, double bearing, double dist, double* eOut,
@@ -74,6 +77,12 @@ void UNeditDatabase::ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target,
 
 int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
                                  std::vector<std::wstring>* records) {
+    // Every point and point-only node has a name of the table, and there are no more of them
+    // than names: room for all of them up front spares the stores a copy of themselves as
+    // they grow.
+    PointList.Reserve(Names.size());
+    PointNodes.reserve(Names.size());
+    Nodes.reserve(Setups.size() + Names.size());
     StationWork work;
     work.Steps = Nodes.size();
     for (const STNSTRUCT& station : Setups)
@@ -82,6 +91,7 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
 
     const bool printing = Report != nullptr && report == 1;
     if (printing) PrintRunHead();
+    work.Printing = printing && Report->KeepsText();
 
     bool aborted = false;
     // Point-only nodes, which setCoord appends as the walk goes, are passed over.
@@ -135,7 +145,7 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
         work.HasShots = HaveSideshotsToReport(&station, records);
         work.HeadPrinted = false;
         // A side-shot pass alone (after an adjustment) prints only stations with shots.
-        if (printing && !(passes == kSideShotPass && !work.HasShots))
+        if (work.Printing && !(passes == kSideShotPass && !work.HasShots))
             PrintStationBlock(station, work);
 
         if ((passes & kForwardPass) != 0 && !station.FSList.empty() &&
@@ -293,7 +303,7 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
     const int from = PointOf(station.Name);
     for (std::size_t t = 0; t < station.FSList.size(); ++t) {
         SSSTRUCT& target = *station.FSList.at(t);
-        if (!work.HeadPrinted && Report != nullptr && report == 1) {
+        if (!work.HeadPrinted && work.Printing) {
             Report->PrintSSHead();
             work.HeadPrinted = true;
         }
@@ -309,7 +319,7 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
         if (!target.AngleValid) continue;
         double e = 0.0, n = 0.0, z = kNoHeight;
         ReduceTarget(station, target, work, e, n, z);
-        if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, true);
+        if (work.Printing) PrintTarget(station, target, e, n, z, true);
         if (IsSelfObservation(station, target)) continue;
         if (FirstSetupOf(target.Name) != nullptr)
             SetCoordOf(target.Name, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
@@ -326,14 +336,14 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
         if (AbortRequested()) return 0;
         UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps),
                        kGeneratingGraphics);
-        if (!work.HeadPrinted && Report != nullptr && report == 1) {
+        if (!work.HeadPrinted && work.Printing) {
             if (work.HasShots) Report->PrintSSHead();
             work.HeadPrinted = true;
         }
         if (!target.AngleValid || target.ForwardFlag) continue;
         double e = 0.0, n = 0.0, z = kNoHeight;
         ReduceTarget(station, target, work, e, n, z);
-        if (Report != nullptr && report == 1) PrintTarget(station, target, e, n, z, false);
+        if (work.Printing) PrintTarget(station, target, e, n, z, false);
         if (IsSelfObservation(station, target)) continue;
         SetCoordOf(target.Name, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
     }

@@ -13,10 +13,11 @@ StationRef StationList::operator[](std::size_t at) const {
     picture.CoordKnown = 1;
     picture.PointOnly = 1;
     picture.CoordFixed = point.CoordFixed;
-    picture.HMode = point.HMode;
-    picture.VMode = point.VMode;
-    picture.AngleUnit = point.AngleUnit;
-    picture.LengthUnit = point.LengthUnit;
+    const ModeSet& modes = Modes[point.Modes];
+    picture.HMode = modes[0];
+    picture.VMode = modes[1];
+    picture.AngleUnit = modes[2];
+    picture.LengthUnit = modes[3];
     picture.Name = point.Name;
     return StationRef(&picture);
 }

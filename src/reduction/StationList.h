@@ -5,6 +5,7 @@
 // reached, which lives as long as the view and is only a picture: writing to it changes
 // nothing. Stations and reverse nodes are the engine's own, good until its next run.
 
+#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <deque>
@@ -12,6 +13,10 @@
 
 #include "platform/text/NameTable.h"
 #include "reduction/ObservationModel.h"
+
+/// The modes and units in force when a node joined the list: HMode, VMode, AngleUnit,
+/// LengthUnit. A survey has few such sets; a point-only node keeps the number of its set.
+using ModeSet = std::array<wchar_t, 4>;
 
 /// A node that only carries a point's coordinates, as setCoord makes it.
 struct PointNode {
@@ -21,10 +26,7 @@ struct PointNode {
     double North = 0.0;
     double Height = 0.0;
     int CoordFixed = 0;
-    wchar_t HMode = L'A';
-    wchar_t VMode = L'Z';
-    wchar_t AngleUnit = L'S';
-    wchar_t LengthUnit = L'M';
+    std::uint32_t Modes = 0;  // the node's ModeSet
 };
 
 /// A place in the station list: a station or reverse node, or a point-only node, with the
@@ -53,10 +55,11 @@ class StationRef {
 
 class StationList {
   public:
+    /// The engine's nodes, tables of names and codes, and sets of modes.
     StationList(const std::deque<STNSTRUCT>& setups, const std::vector<PointNode>& points,
                 const std::vector<NodeEntry>& nodes, const nedit::NameTable& names,
-                const nedit::NameTable& codes)
-        : Setups(setups), Points(points), Nodes(nodes), Names(names), Codes(codes) {}
+                const nedit::NameTable& codes, const std::vector<ModeSet>& modes)
+        : Setups(setups), Points(points), Nodes(nodes), Names(names), Codes(codes), Modes(modes) {}
 
     class iterator {
       public:
@@ -87,5 +90,6 @@ class StationList {
     const std::vector<NodeEntry>& Nodes;
     const nedit::NameTable& Names;
     const nedit::NameTable& Codes;
+    const std::vector<ModeSet>& Modes;
     mutable std::deque<STNSTRUCT> Pictures;  // of the point-only nodes reached
 };

@@ -147,7 +147,9 @@ class UNeditDatabase {
     double GetStnScaleFactor(const std::wstring& name) const;
 
     /// The station list, point-only nodes included, in its order.
-    StationList GetStations() const { return StationList(Setups, PointNodes, Nodes, Names, Codes); }
+    StationList GetStations() const {
+        return StationList(Setups, PointNodes, Nodes, Names, Codes, ModeSets);
+    }
     STNSTRUCT* GetCurStn() const { return CurStn; }
     SSSTRUCT* GetCurrentSS() const { return CurSS; }
     wchar_t GetHMode() const { return HMode; }
@@ -306,6 +308,8 @@ class UNeditDatabase {
     void AppendNode(std::uint32_t ref, NameId name);
     void AppendSetup(STNSTRUCT& station);
     void AppendPointNode(NameId name, double e, double n, double z, NameId code);
+    /// The number of the set of the modes and units in force now.
+    std::uint32_t ModesNow();
     /// The first node of that name in the list, or NodeEntry::kNone.
     std::uint32_t FirstNodeOf(NameId name) const;
     STNSTRUCT* FirstSetupOf(NameId name) const;
@@ -404,6 +408,7 @@ class UNeditDatabase {
     nedit::NameTable Codes;
     std::deque<STNSTRUCT> Setups;
     std::vector<PointNode> PointNodes;
+    std::vector<ModeSet> ModeSets;
     std::vector<NodeEntry> Nodes;
     std::vector<std::uint32_t> FirstNodeOfName;  // by name id, into Nodes
     std::vector<std::uint32_t> LastNodeOfName;

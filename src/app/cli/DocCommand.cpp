@@ -18,6 +18,7 @@
 #include "platform/settings/DataDirectory.h"
 #include "platform/text/WideText.h"
 #include "report/NeditIni.h"
+#include "report/UNeditReport.h"
 
 namespace {
 
@@ -91,6 +92,8 @@ int Reduce(OpenJob& open, const std::string& name, const std::string& report, bo
     UNeditDoc* doc = Find(open, name);
     if (doc == nullptr) return exit_status::Failed;
     open.host.SetEcho(!json);
+    // The report takes part in the reduction; its text is kept only when it is asked for.
+    if (doc->GetNReport() != nullptr) doc->GetNReport()->SetKeepText(!report.empty());
     UListCtrl& list = doc->OpenList();
     const int result = doc->SetupDataBase(&list);
     // Addition points went into the rows; they are kept with the document.

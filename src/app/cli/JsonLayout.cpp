@@ -14,6 +14,8 @@ std::string Dump(const Value& value) {
     return value.dump(-1, ' ', false, nlohmann::detail::error_handler_t::replace);
 }
 
+}  // namespace
+
 std::string Number(double number) {
     if (!std::isfinite(number)) throw std::domain_error("a number that is not finite has no JSON");
     char buffer[64];
@@ -21,10 +23,12 @@ std::string Number(double number) {
     return std::string(buffer, result.ptr);
 }
 
-}  // namespace
-
 Value Text(const std::wstring& text) {
     return nedit::ToUtf8(text);
+}
+
+std::string String(const std::wstring& text) {
+    return Dump(Text(text));
 }
 
 std::string Inline(const Value& value) {
@@ -53,14 +57,25 @@ std::string Inline(const Value& value) {
 }
 
 std::string Rows(const std::vector<Value>& rows, int indent) {
-    const std::string margin(static_cast<std::size_t>(indent), ' ');
-    std::string out = "[";
-    const char* separator = "\n";
-    for (const Value& row : rows) {
-        out += separator + margin + "  " + Inline(row);
-        separator = ",\n";
-    }
-    return out + "\n" + margin + "]";
+    std::string out;
+    RowWriter writer(out, indent);
+    for (const Value& row : rows) writer.Row(Inline(row));
+    writer.End();
+    return out;
+}
+
+void RowWriter::Row(const std::string& inlineRow) {
+    Out += Separator;
+    Out += Margin;
+    Out += "  ";
+    Out += inlineRow;
+    Separator = ",\n";
+}
+
+void RowWriter::End() {
+    Out += '\n';
+    Out += Margin;
+    Out += ']';
 }
 
 std::string Members(const std::vector<std::pair<const char*, std::string>>& members) {

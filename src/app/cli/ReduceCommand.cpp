@@ -82,6 +82,9 @@ int Reduce(const ReduceOptions& options) {
     if (options.columns_given) SetFlagsFromOrder(parameters, nedit::FromUtf8(options.columns));
 
     UNeditDatabase& engine = session.StartEngine();
+    // A report nobody asked for is still made, since it takes part in the reduction, but its
+    // text is not kept.
+    session.report->SetKeepText(!options.report.empty());
     if (!engine.LoadNeFile(nedit::FromUtf8(options.file))) {
         if (options.json) {
             for (const std::wstring& message : session.host.Messages()) {

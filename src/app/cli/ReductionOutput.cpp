@@ -53,49 +53,101 @@ bool TellNonFinite(const UNeditDatabase& engine, ConsoleDialogHost& host) {
     return points + circles > 0;
 }
 
+// Standard output, a piece at a time.
+bool Print(std::string_view text) {
+    return std::fwrite(text.data(), 1, text.size(), stdout) == text.size();
+}
+
+// The reduced points of a run whose coordinates are finite numbers, in the order of the point
+// store, one at a time.
+void EachReducedPoint(const UNeditDatabase& engine,
+                      const std::function<void(const PointRow&)>& take) {
+    for (const UNeditPt& point : engine.GetPointList()) {
+        if (!IsFinite(point)) continue;
+        take({point.GetID(), point.x, point.y, point.z > kNoHeight, point.z, point.GetCode()});
+    }
+}
+
+// The report on standard output, ended by a line feed. Like a C string, it ends at a NUL.
+void PrintReport(const UNeditReport& report) {
+    char last = '\n';
+    bool any = false;
+    const bool whole = report.WriteUtf8([&](std::string_view piece) {
+        const std::size_t nul = piece.find('\0');
+        const std::string_view kept = piece.substr(0, nul);
+        if (!kept.empty()) {
+            Print(kept);
+            last = kept.back();
+            any = true;
+        }
+        return nul == std::string_view::npos;
+    });
+    if (whole && any && last != '\n') Print("\n");
+}
+
 }  // namespace
 
-std::string ReductionJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages) {
-    std::vector<json::Value> lines;
-    for (const UNeditLine& line : engine.GetLineList()) {
-        lines.push_back({{"from", json::Text(line.GetFromPt())},
-                         {"to", json::Text(line.GetToPt())},
-                         {"station_line", line.GetStationLine() != 0}});
+bool WriteReductionJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages,
+                        const std::function<bool(std::string_view)>& write) {
+    // Rows are written out as they are laid out, a few at a time.
+    constexpr std::size_t kPiece = 1 << 16;
+    std::string out = "{\n  \"points\": ";
+    bool ok = true;
+    auto flush = [&](bool always) {
+        if (always || out.size() >= kPiece) {
+            ok = ok && write(out);
+            out.clear();
+        }
+    };
+    {
+        json::RowWriter points(out, 2);
+        EachReducedPoint(engine, [&](const PointRow& point) {
+            points.Row(PointJson(point));
+            flush(false);
+        });
+        points.End();
     }
-    std::vector<json::Value> arcs;
-    for (const UNeditArc& arc : engine.GetArcList()) {
-        arcs.push_back({{"start", json::Text(arc.GetStartPt())},
-                        {"end", json::Text(arc.GetEndPt())},
-                        {"third", json::Text(arc.GetThirdPt())},
-                        {"type", arc.GetArcType()}});
+    out += ",\n  \"lines\": ";
+    {
+        json::RowWriter lines(out, 2);
+        for (const UNeditLine& line : engine.GetLineList()) {
+            lines.Row(json::Inline({{"from", json::Text(line.GetFromPt())},
+                                    {"to", json::Text(line.GetToPt())},
+                                    {"station_line", line.GetStationLine() != 0}}));
+            flush(false);
+        }
+        lines.End();
     }
-    std::vector<json::Value> circles;
-    for (const UWCircle& circle : engine.GetCircleList()) {
-        if (!IsFinite(circle)) continue;
-        circles.push_back({{"e", circle.GetCentre().x},
-                           {"n", circle.GetCentre().y},
-                           {"radius", circle.GetRadius()}});
+    out += ",\n  \"arcs\": ";
+    {
+        json::RowWriter arcs(out, 2);
+        for (const UNeditArc& arc : engine.GetArcList()) {
+            arcs.Row(json::Inline({{"start", json::Text(arc.GetStartPt())},
+                                   {"end", json::Text(arc.GetEndPt())},
+                                   {"third", json::Text(arc.GetThirdPt())},
+                                   {"type", arc.GetArcType()}}));
+            flush(false);
+        }
+        arcs.End();
+    }
+    out += ",\n  \"circles\": ";
+    {
+        json::RowWriter circles(out, 2);
+        for (const UWCircle& circle : engine.GetCircleList()) {
+            if (!IsFinite(circle)) continue;
+            circles.Row(json::Inline({{"e", circle.GetCentre().x},
+                                      {"n", circle.GetCentre().y},
+                                      {"radius", circle.GetRadius()}}));
+            flush(false);
+        }
+        circles.End();
     }
     json::Value said = json::Value::array();
     for (const std::wstring& message : messages) said.push_back(json::Text(message));
-    return json::Members({{"points", PointsJson(ReducedPoints(engine), 2)},
-                          {"lines", json::Rows(lines, 2)},
-                          {"arcs", json::Rows(arcs, 2)},
-                          {"circles", json::Rows(circles, 2)},
-                          {"error", std::to_string(engine.GetErrorCode())},
-                          {"messages", json::Inline(said)}}) +
-           "\n";
-}
-
-std::vector<PointRow> ReducedPoints(const UNeditDatabase& engine) {
-    std::vector<PointRow> points;
-    points.reserve(engine.GetPointList().size());
-    for (const UNeditPt& point : engine.GetPointList()) {
-        if (!IsFinite(point)) continue;
-        points.push_back(
-            {point.GetID(), point.x, point.y, point.z > kNoHeight, point.z, point.GetCode()});
-    }
-    return points;
+    out += ",\n  \"error\": " + std::to_string(engine.GetErrorCode());
+    out += ",\n  \"messages\": " + json::Inline(said) + "\n}\n";
+    flush(true);
+    return ok;
 }
 
 void CheckOutputOptions(const std::string& reportPath, bool json) {
@@ -108,20 +160,24 @@ int WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* repor
                          const ReductionOutputs& outputs, ConsoleDialogHost& host) {
     const bool left_out = TellNonFinite(engine, host);
     if (report != nullptr && outputs.report == "-") {
-        std::string text = nedit::ToUtf8(report->GetText());
-        if (!text.empty() && text.back() != '\n') text += '\n';
-        std::fputs(text.c_str(), stdout);
+        PrintReport(*report);
     } else if (report != nullptr && !outputs.report.empty() &&
                !report->SaveAsText(outputs.report)) {
         std::fprintf(stderr, "sxnedit: cannot write %s\n", outputs.report.c_str());
         return exit_status::Failed;
     }
     if (outputs.json) {
-        std::fputs(ReductionJson(engine, host.Messages()).c_str(), stdout);
+        WriteReductionJson(engine, host.Messages(), Print);
     } else if (outputs.report != "-") {
-        std::fputs(PointsTable(ReducedPoints(engine), outputs.decimals).c_str(), stdout);
+        Print(PointsTableHead());
+        EachReducedPoint(
+            engine, [&](const PointRow& point) { Print(PointsTableRow(point, outputs.decimals)); });
     }
-    if (!outputs.points.empty() && !WritePointsCsv(outputs.points, ReducedPoints(engine))) {
+    if (!outputs.points.empty() &&
+        !WritePointsCsv(outputs.points,
+                        [&engine](const std::function<void(const PointRow&)>& take) {
+                            EachReducedPoint(engine, take);
+                        })) {
         return exit_status::Failed;
     }
     return left_out ? exit_status::Failed : exit_status::Ok;

@@ -7,7 +7,9 @@
 // that no program reads "inf" as a coordinate or null as "no height", and the run fails.
 // A circle that came out so is left out alike.
 
+#include <functional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "PointOutput.h"
@@ -16,13 +18,11 @@ class ConsoleDialogHost;
 class UNeditDatabase;
 class UNeditReport;
 
-/// The reduced points of a run whose coordinates are finite numbers, in the order of the
-/// point store.
-std::vector<PointRow> ReducedPoints(const UNeditDatabase& engine);
-
 /// One JSON object: points, lines, arcs, circles (those with finite numbers), the engine's
-/// error code and the messages.
-std::string ReductionJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages);
+/// error code and the messages, given to `write` a piece at a time (a survey's points are
+/// never laid out whole in memory). False when `write` refused a piece.
+bool WriteReductionJson(const UNeditDatabase& engine, const std::vector<std::wstring>& messages,
+                        const std::function<bool(std::string_view)>& write);
 
 /// Throws CLI::ValidationError when the JSON and the report would both go to standard output.
 void CheckOutputOptions(const std::string& reportPath, bool json);

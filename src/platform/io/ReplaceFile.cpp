@@ -43,7 +43,7 @@ bool HasWriteBit(const struct stat& info) {
     return (info.st_mode & (S_IWUSR | S_IWGRP | S_IWOTH)) != 0;
 }
 
-bool WriteAll(int fd, const std::string& bytes, bool socket) {
+bool WriteAll(int fd, std::string_view bytes, bool socket) {
     std::size_t written = 0;
     while (written < bytes.size()) {
         const char* from = bytes.data() + written;
@@ -54,6 +54,23 @@ bool WriteAll(int fd, const std::string& bytes, bool socket) {
         written += static_cast<std::size_t>(n);
     }
     return true;
+}
+
+// The pieces of `produce`, gathered into writes of a good size.
+bool WritePieces(int fd, bool socket, const std::function<bool(const ByteSink&)>& produce) {
+    constexpr std::size_t kWriteSize = 1 << 16;
+    std::string buffer;
+    buffer.reserve(kWriteSize);
+    const ByteSink sink = [&](std::string_view piece) {
+        if (buffer.size() + piece.size() > kWriteSize) {
+            if (!WriteAll(fd, buffer, socket)) return false;
+            buffer.clear();
+        }
+        if (piece.size() >= kWriteSize) return WriteAll(fd, piece, socket);
+        buffer.append(piece);
+        return true;
+    };
+    return produce(sink) && WriteAll(fd, buffer, socket);
 }
 
 // A reader of a pipe that goes away must fail the write, not end the program: SIGPIPE is
@@ -100,7 +117,8 @@ int ConnectSocket(const std::string& path) {
     return fd;
 }
 
-bool WriteInPlace(const std::string& path, const std::string& bytes, const struct stat& info) {
+bool WriteInPlace(const std::string& path, const std::function<bool(const ByteSink&)>& produce,
+                  const struct stat& info) {
     const bool socket = S_ISSOCK(info.st_mode);
     const int fd =
         socket ? ConnectSocket(path) : ::open(path.c_str(), O_WRONLY | O_NOCTTY | O_CLOEXEC);
@@ -108,13 +126,14 @@ bool WriteInPlace(const std::string& path, const std::string& bytes, const struc
     bool ok;
     {
         PipeSignalHold hold;
-        ok = WriteAll(fd, bytes, socket);
+        ok = WritePieces(fd, socket, produce);
     }
     if (::close(fd) != 0) ok = false;
     return ok;
 }
 
-bool WriteBesideAndRename(const std::string& path, const std::string& bytes,
+bool WriteBesideAndRename(const std::string& path,
+                          const std::function<bool(const ByteSink&)>& produce,
                           const struct stat* old_stat) {
     std::string temporary;
     int fd = -1;
@@ -124,7 +143,7 @@ bool WriteBesideAndRename(const std::string& path, const std::string& bytes,
         if (fd < 0 && errno != EEXIST) return false;
     }
     if (fd < 0) return false;
-    bool ok = WriteAll(fd, bytes, false);
+    bool ok = WritePieces(fd, false, produce);
     if (ok && old_stat != nullptr) {
         // Only root may give a file away; anyone else keeps the file as their own.
         if (::fchown(fd, old_stat->st_uid, old_stat->st_gid) != 0) {
@@ -164,12 +183,16 @@ std::string WhyNotWritable(const std::string& target) {
 }
 
 bool ReplaceFile(const std::string& target, const std::string& bytes) {
+    return ReplaceFile(target, [&bytes](const ByteSink& write) { return write(bytes); });
+}
+
+bool ReplaceFile(const std::string& target, const std::function<bool(const ByteSink&)>& produce) {
     if (!WhyNotWritable(target).empty()) return false;
     const std::string path = FollowLinks(target);
     struct stat info {};
     const bool exists = ::stat(path.c_str(), &info) == 0;
-    if (exists && !S_ISREG(info.st_mode)) return WriteInPlace(path, bytes, info);
-    return WriteBesideAndRename(path, bytes, exists ? &info : nullptr);
+    if (exists && !S_ISREG(info.st_mode)) return WriteInPlace(path, produce, info);
+    return WriteBesideAndRename(path, produce, exists ? &info : nullptr);
 }
 
 }  // namespace nedit

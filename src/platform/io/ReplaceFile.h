@@ -14,13 +14,22 @@
 // A file with other hard links is replaced under this name only; the other names keep the
 // old text.
 
+#include <functional>
 #include <string>
+#include <string_view>
 
 namespace nedit {
+
+/// Takes the next piece of what is written; false when it cannot be written.
+using ByteSink = std::function<bool(std::string_view)>;
 
 /// Writes `bytes` to `target` (a UTF-8 path) as said above. False when it cannot be written:
 /// the target is then as it was.
 bool ReplaceFile(const std::string& target, const std::string& bytes);
+/// The same for text made piece by piece: `produce` gives the pieces, in order, to the sink
+/// it is handed, and gives false when it or the sink failed. A large output is never held
+/// whole in memory.
+bool ReplaceFile(const std::string& target, const std::function<bool(const ByteSink&)>& produce);
 
 /// Why ReplaceFile would refuse `target` ("it is read-only", "it is a folder", "the folder
 /// /x does not exist", "its folder /x cannot be written"), or empty when it can be written.

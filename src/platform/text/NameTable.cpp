@@ -20,18 +20,18 @@ NameTable::Id NameTable::Find(std::wstring_view name) const {
     for (std::size_t i = hash & mask;; i = (i + 1) & mask) {
         const Slot& slot = Slots[i];
         if (slot.Name == kNone) return kNone;
-        if (slot.Hash == hash && Names[slot.Name] == name) return slot.Name;
+        if (slot.Hash == hash && Name(slot.Name).view() == name) return slot.Name;
     }
 }
 
 NameTable::Id NameTable::Intern(std::wstring_view name) {
-    if (2 * (Names.size() + 1) > Slots.size()) Grow();
+    if (4 * (Names.size() + 1) > 3 * Slots.size()) Grow();
     const std::uint32_t hash = HashOf(name);
     const std::size_t mask = Slots.size() - 1;
     std::size_t i = hash & mask;
     for (; Slots[i].Name != kNone; i = (i + 1) & mask) {
         const Slot& slot = Slots[i];
-        if (slot.Hash == hash && Names[slot.Name] == name) return slot.Name;
+        if (slot.Hash == hash && Name(slot.Name).view() == name) return slot.Name;
     }
     const Id id = static_cast<Id>(Names.size());
     Names.push_back(Store(name));
@@ -39,18 +39,20 @@ NameTable::Id NameTable::Intern(std::wstring_view name) {
     return id;
 }
 
-std::wstring_view NameTable::Store(std::wstring_view name) {
-    if (name.empty()) return {};
-    if (name.size() > BlockSize - BlockUsed) {
+const wchar_t* NameTable::Store(std::wstring_view name) {
+    // The length, then the characters.
+    const std::size_t needed = name.size() + 1;
+    if (needed > BlockSize - BlockUsed) {
         // A name longer than a block gets a block of its own.
-        BlockSize = std::max(kBlockCharacters, name.size());
+        BlockSize = std::max(kBlockCharacters, needed);
         Blocks.push_back(std::make_unique<wchar_t[]>(BlockSize));
         BlockUsed = 0;
     }
     wchar_t* at = Blocks.back().get() + BlockUsed;
-    std::copy(name.begin(), name.end(), at);
-    BlockUsed += name.size();
-    return std::wstring_view(at, name.size());
+    at[0] = static_cast<wchar_t>(name.size());
+    std::copy(name.begin(), name.end(), at + 1);
+    BlockUsed += needed;
+    return at + 1;
 }
 
 void NameTable::Grow() {

@@ -1,13 +1,22 @@
 #include "platform/text/TextLines.h"
 
+#include <algorithm>
+#include <cstring>
+
 namespace nedit {
 namespace {
 
-constexpr unsigned kLengthBits = 24;
+constexpr unsigned kLengthBits = 21;
+constexpr unsigned kOffsetBits = 21;
 constexpr std::uint64_t kLengthMask = (std::uint64_t{1} << kLengthBits) - 1;
+constexpr std::uint64_t kOffsetMask = (std::uint64_t{1} << kOffsetBits) - 1;
+
+std::size_t BlockOf(std::uint64_t ref) {
+    return static_cast<std::size_t>(ref >> (kLengthBits + kOffsetBits));
+}
 
 std::size_t OffsetOf(std::uint64_t ref) {
-    return static_cast<std::size_t>(ref >> kLengthBits);
+    return static_cast<std::size_t>((ref >> kLengthBits) & kOffsetMask);
 }
 
 std::size_t LengthOf(std::uint64_t ref) {
@@ -18,19 +27,22 @@ std::size_t LengthOf(std::uint64_t ref) {
 
 std::string_view TextLines::operator[](std::size_t line) const {
     const std::uint64_t ref = Refs[line];
-    return std::string_view(Text).substr(OffsetOf(ref), LengthOf(ref));
+    return std::string_view(Blocks[BlockOf(ref)].get() + OffsetOf(ref), LengthOf(ref));
 }
 
 std::uint64_t TextLines::Store(std::string_view line) {
     if (line.size() > kMaxLineBytes) line = line.substr(0, kMaxLineBytes);
-    const std::uint64_t offset = Text.size();
-    // `line` may lie in Text itself; append copies it before the old block goes.
-    Text.append(line.data(), line.size());
-    return offset << kLengthBits | line.size();
-}
-
-void TextLines::Forget(std::uint64_t ref) {
-    Garbage += LengthOf(ref);
+    if (Blocks.empty() || line.size() > kBlockBytes - BlockUsed) {
+        // `line` may lie in a block; blocks stay where they are, so it stays good.
+        Blocks.push_back(std::make_unique<char[]>(kBlockBytes));
+        BlockUsed = 0;
+    }
+    const std::uint64_t block = Blocks.size() - 1;
+    const std::uint64_t offset = BlockUsed;
+    if (!line.empty()) std::memcpy(Blocks.back().get() + BlockUsed, line.data(), line.size());
+    BlockUsed += line.size();
+    Live += line.size();
+    return block << (kLengthBits + kOffsetBits) | offset << kLengthBits | line.size();
 }
 
 void TextLines::push_back(std::string_view line) {
@@ -51,42 +63,37 @@ void TextLines::insert(std::size_t at, const std::vector<std::string>& lines) {
 
 void TextLines::replace(std::size_t at, std::string_view line) {
     const std::uint64_t ref = Store(line);
-    Forget(Refs[at]);
+    Live -= LengthOf(Refs[at]);
+    Garbage += LengthOf(Refs[at]);
     Refs[at] = ref;
     CompactWhenWasteful();
 }
 
 void TextLines::erase(std::size_t at, std::size_t count) {
     const auto first = Refs.begin() + static_cast<std::ptrdiff_t>(at);
-    for (auto ref = first; ref != first + static_cast<std::ptrdiff_t>(count); ++ref) Forget(*ref);
-    Refs.erase(first, first + static_cast<std::ptrdiff_t>(count));
+    const auto last = first + static_cast<std::ptrdiff_t>(count);
+    for (auto ref = first; ref != last; ++ref) {
+        Live -= LengthOf(*ref);
+        Garbage += LengthOf(*ref);
+    }
+    Refs.erase(first, last);
     CompactWhenWasteful();
 }
 
 void TextLines::clear() {
-    Text.clear();
+    Blocks.clear();
+    BlockUsed = kBlockBytes;
     Refs.clear();
-    Garbage = 0;
-}
-
-void TextLines::reserve(std::size_t lines, std::size_t bytes) {
-    Refs.reserve(lines);
-    Text.reserve(bytes);
+    Live = Garbage = 0;
 }
 
 void TextLines::CompactWhenWasteful() {
     // A little waste is cheaper than copying; more than the live text is not.
-    if (Garbage < 4096 || Garbage <= Text.size() - Garbage) return;
-    std::string compact;
-    compact.reserve(Text.size() - Garbage);
-    for (std::uint64_t& ref : Refs) {
-        const std::size_t length = LengthOf(ref);
-        const std::uint64_t offset = compact.size();
-        compact.append(Text, OffsetOf(ref), length);
-        ref = offset << kLengthBits | length;
-    }
-    Text = std::move(compact);
-    Garbage = 0;
+    if (Garbage < kBlockBytes || Garbage <= Live) return;
+    TextLines compact;
+    compact.Refs.reserve(Refs.size());
+    for (std::size_t line = 0; line < Refs.size(); ++line) compact.push_back((*this)[line]);
+    *this = std::move(compact);
 }
 
 }  // namespace nedit

@@ -1,14 +1,16 @@
 #pragma once
-// Lines of text held in one block: the UTF-8 bytes of every line one after another, and a
-// table of where each line starts and how long it is. A line costs its bytes and eight more,
-// where a string of its own would cost a heap block and a header besides, so a list of
-// millions of rows or report lines stays close to the size of its text.
+// Lines of text held in blocks: the UTF-8 bytes of the lines one after another in blocks of
+// 2 MiB, and a table of where each line lies. A line costs its bytes and eight more, where a
+// string of its own would cost a heap block and a header besides, so a list of millions of
+// rows or report lines stays close to the size of its text; and the text grows block by block,
+// never copied to a larger place.
 //
 // A line's view is good until the lines next change. Replacing or removing a line leaves its
-// old bytes behind until they are more than the live text; the block is then compacted.
+// old bytes behind until they outweigh the live text; the blocks are then written anew.
 
 #include <cstddef>
 #include <cstdint>
+#include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -18,7 +20,7 @@ namespace nedit {
 class TextLines {
   public:
     /// A longer line keeps its first this many bytes.
-    static constexpr std::size_t kMaxLineBytes = (std::size_t{1} << 24) - 1;
+    static constexpr std::size_t kMaxLineBytes = (std::size_t{1} << 21) - 1;
 
     std::size_t size() const { return Refs.size(); }
     bool empty() const { return Refs.empty(); }
@@ -33,19 +35,21 @@ class TextLines {
     void replace(std::size_t at, std::string_view line);
     void erase(std::size_t at, std::size_t count = 1);
     void clear();
-    /// Room for `lines` lines of `bytes` bytes in all without growing.
-    void reserve(std::size_t lines, std::size_t bytes);
+    /// Room for `lines` lines without growing the table.
+    void reserve(std::size_t lines) { Refs.reserve(lines); }
 
   private:
-    /// Appends the bytes and gives the line's reference: offset in the high 40 bits, length
-    /// in the low 24.
+    /// Copies the bytes into the blocks and gives the line's reference: the block in the high
+    /// 22 bits, the offset in it in the next 21, the length in the low 21.
     std::uint64_t Store(std::string_view line);
-    void Forget(std::uint64_t ref);
     void CompactWhenWasteful();
 
-    std::string Text;
+    static constexpr std::size_t kBlockBytes = std::size_t{1} << 21;
+    std::vector<std::unique_ptr<char[]>> Blocks;
+    std::size_t BlockUsed = kBlockBytes;  // bytes used in the last block; full when none yet
     std::vector<std::uint64_t> Refs;
-    std::size_t Garbage = 0;  // bytes of Text that no line refers to any more
+    std::size_t Live = 0;     // bytes of the lines
+    std::size_t Garbage = 0;  // bytes in the blocks that no line refers to any more
 };
 
 }  // namespace nedit

@@ -1,5 +1,8 @@
 #include <gtest/gtest.h>
 
+#include <string>
+#include <vector>
+
 #include "platform/report/UReportDoc.h"
 
 TEST(UReportDoc, WritesLinesAndKeepsBlocksOnOnePage) {
@@ -26,6 +29,22 @@ TEST(UReportDoc, WritesLinesAndKeepsBlocksOnOnePage) {
     report.Clear();
     report.KeepLines(10);
     EXPECT_EQ(report.GetText(), L"");
+}
+
+TEST(UReportDoc, AReportThatKeepsNoTextHoldsOnlyTheLineBeingWritten) {
+    UReportDoc report;
+    report.SetKeepText(false);
+    report.SetPageLength(3);
+    report.WriteText(L"one", 0, 1);
+    report.KeepLines(3);
+    report.WriteText(L"two", 0, 1);
+    report.WriteText(L"three", 0, 0);
+    EXPECT_EQ(report.Lines(), std::vector<std::wstring>{L"three"});
+    // A page that ends the report full has nothing behind it: text that is kept ends so.
+    UReportDoc kept;
+    kept.SetPageLength(3);
+    for (const wchar_t* line : {L"one", L"two", L"three"}) kept.WriteText(line, 0, 1);
+    EXPECT_EQ(kept.GetText(), L"one\ntwo\nthree\n");
 }
 
 TEST(UReportDoc, SavesItsTextAsUtf8) {

@@ -35,6 +35,13 @@ TEST(TextLines, KeepsLinesInOrderThroughInsertsReplacementsAndErasures) {
     EXPECT_TRUE(lines.empty());
 }
 
+TEST(TextLines, AnEmptyLineMayComeFirst) {
+    TextLines lines;
+    lines.push_back("");
+    lines.push_back("A");
+    EXPECT_EQ(All(lines), (std::vector<std::string>{"", "A"}));
+}
+
 TEST(TextLines, ALineMayBeCopiedFromAnotherLine) {
     TextLines lines;
     lines.push_back("SS        ID=P1");
@@ -45,15 +52,16 @@ TEST(TextLines, ALineMayBeCopiedFromAnotherLine) {
 }
 
 TEST(TextLines, ManyReplacementsLeaveTheTextWhole) {
-    // Each replacement leaves bytes behind until they outweigh the live text and are dropped.
+    // Each replacement leaves bytes behind until they outweigh the live text and are dropped;
+    // here they do so many times over, across blocks.
     TextLines lines;
     for (int i = 0; i < 100; ++i) lines.push_back("ROW " + std::to_string(i));
-    for (int round = 0; round < 200; ++round) {
+    for (int round = 0; round < 5000; ++round) {
         for (int i = 0; i < 100; ++i) {
             lines.replace(static_cast<std::size_t>(i),
                           "ROW " + std::to_string(i) + " ROUND " + std::to_string(round));
         }
     }
     for (int i = 0; i < 100; ++i)
-        EXPECT_EQ(lines[static_cast<std::size_t>(i)], "ROW " + std::to_string(i) + " ROUND 199");
+        EXPECT_EQ(lines[static_cast<std::size_t>(i)], "ROW " + std::to_string(i) + " ROUND 4999");
 }
