@@ -108,6 +108,7 @@ class UListCtrl : public nedit::RowSource {
     /// The row's text; empty for a row that does not exist.
     std::wstring GetItemText(int row) const override;
     std::string_view GetRowUtf8(int row) const override;
+    const nedit::TextLines* GetLines() const override { return &rows_; }
     /// Removes every row, with the selection and the focus.
     void DeleteAllItems() override;
     /// Removes the row; a row that does not exist is left alone.

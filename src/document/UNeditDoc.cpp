@@ -18,6 +18,20 @@ namespace {
 
 constexpr const wchar_t* kReportTitle = L"Raw Data Reduction Report";
 
+// The stream holds exactly the rows, each ended by a line feed, as Save writes them.
+bool HoldsRows(std::string_view stored, const UListCtrl& list) {
+    std::size_t at = 0;
+    for (int row = 0; row < list.GetItemCount(); ++row) {
+        const std::string_view text = list.GetRowUtf8(row);
+        if (stored.size() - at < text.size() + 1 || stored.compare(at, text.size(), text) != 0 ||
+            stored[at + text.size()] != '\n') {
+            return false;
+        }
+        at += text.size() + 1;
+    }
+    return at == stored.size();
+}
+
 }  // namespace
 
 UNeditDoc::UNeditDoc(USurveyDoc* job, UDocument* parent)
@@ -57,27 +71,45 @@ int UNeditDoc::OpenDocument(const std::wstring& name, UDocument* container) {
 
 int UNeditDoc::Load(UListCtrl* list) {
     UStorage* storage = GetStorage();
-    UStreamFile stream;
-    if (list == nullptr || storage == nullptr ||
-        !stream.OpenStream(*storage, kNeutralDataStream, kReadMode))
-        return 0;
+    if (list == nullptr || storage == nullptr) return 0;
+    const bool own_rows = list == List.get() && list->GetItemCount() == 0;
+    bool held_as_rows = false;
+    // The stream is read where the job holds it, without a copy of its own.
+    const bool read = storage->ReadStream(kNeutralDataStream, [&](std::string_view stored) {
+        LoadRows(stored, list);
+        held_as_rows = own_rows && HoldsRows(stored, *list);
+    });
+    if (!read) return 0;
+    StoredRevision = held_as_rows ? list->GetRevision() : ~std::uint64_t{0};
+    std::string settings;
+    if (storage->ReadStream(kSettingsStream, settings) && !NeditSettings.Read(settings)) return 0;
+    return 1;
+}
+
+void UNeditDoc::LoadRows(std::string_view stored, UListCtrl* list) {
     // The document's own list is its text; the text read into another list is kept here.
     const bool keep_text = list != List.get();
     NeuText.clear();
     NamelessCoordinates coordinates;
-    std::string_view bytes;
     std::string decoded;
     std::string upper;
     std::string completed;
+    // The next line without its line end (LF or CR LF); false at the end.
+    std::size_t at = 0;
+    auto next_line = [&](std::string_view& line) {
+        if (at >= stored.size()) return false;
+        const std::size_t end = std::min(stored.find('\n', at), stored.size());
+        line = stored.substr(at, end - at);
+        if (!line.empty() && line.back() == '\r') line.remove_suffix(1);
+        at = end + 1;
+        return true;
+    };
     bool first = true;
-    while (stream.ReadLine(bytes)) {
-        if (stream.GetLength() > 0) {
-            Progress->Update(static_cast<int>(100 * stream.GetPosition() / stream.GetLength()),
-                             L"");
-        }
+    for (std::string_view bytes; next_line(bytes);) {
+        Progress->Update(static_cast<int>(100 * std::min(at, stored.size()) / stored.size()), L"");
         if (bytes.empty()) {
             int rest = 0;
-            while (stream.ReadLine(bytes)) ++rest;
+            while (next_line(bytes)) ++rest;
             if (rest > 0) {
                 nedit::AppMessageBox(Host,
                                      nedit::Translate(L"The records of {1} end at an empty line; "
@@ -102,10 +134,6 @@ int UNeditDoc::Load(UListCtrl* list) {
         }
         if (GetAbortProcess()) break;
     }
-    stream.Abort();
-    std::string settings;
-    if (storage->ReadStream(kSettingsStream, settings) && !NeditSettings.Read(settings)) return 0;
-    return 1;
 }
 
 int UNeditDoc::Save(UListCtrl* list, int additionPoints) {
@@ -118,12 +146,19 @@ int UNeditDoc::Save(UListCtrl* list, int additionPoints) {
         }
     }
     UStorage* storage = GetStorage();
+    // The stream holds these very rows already.
+    if (list != nullptr && list == List.get() && list->GetRevision() == StoredRevision)
+        return WriteSettingsStream();
     UStreamFile stream;
     if (storage == nullptr || !stream.CreateStream(*storage, kNeutralDataStream, kCreateMode))
         return 0;
     if (list != nullptr) {
         const bool keep_text = list != List.get();
         NeuText.clear();
+        std::size_t bytes = 0;
+        for (int row = 0; row < list->GetItemCount(); ++row)
+            bytes += list->GetRowUtf8(row).size() + 1;
+        stream.Reserve(bytes);
         for (int row = 0; row < list->GetItemCount(); ++row) {
             const std::string_view text = list->GetRowUtf8(row);
             stream.Write(text.data(), text.size());
@@ -137,6 +172,7 @@ int UNeditDoc::Save(UListCtrl* list, int additionPoints) {
         stream.Write(NeuText.data(), NeuText.size());
     }
     stream.Close();
+    if (list != nullptr && list == List.get()) StoredRevision = list->GetRevision();
     return WriteSettingsStream();
 }
 

@@ -176,6 +176,8 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     /// What the driver and the link said during a transfer, shown one message each.
     void ShowTransferMessages();
     void TakeJobUnits();
+    /// The lines of a stored "NeutralData" stream into `list`, as Load reads them.
+    void LoadRows(std::string_view stored, UListCtrl* list);
     int WriteSettingsStream();
     void StartEngine(UListCtrl* list);
     std::unique_ptr<UListCtrl> MakeList();
@@ -189,6 +191,10 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     nedit::ProgressSink OwnProgress;
     nedit::ProgressSink* Progress = &OwnProgress;
     std::string NeuText;  // UTF-8; the text of a list other than the document's own
+    /// The revision of the document's own list when the stream "NeutralData" held exactly
+    /// its rows (read from it or written to it); a save of rows the stream holds writes
+    /// nothing again.
+    std::uint64_t StoredRevision = ~std::uint64_t{0};
     std::wstring NeuFileName;
     std::unique_ptr<UListCtrl> List;
     std::unique_ptr<UNeditDatabase> Database;

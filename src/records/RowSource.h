@@ -10,6 +10,8 @@
 #include <string>
 #include <string_view>
 
+#include "platform/text/TextLines.h"
+
 namespace nedit {
 
 class RowSource {
@@ -22,6 +24,10 @@ class RowSource {
     /// The row's text as UTF-8, good until the rows next change; empty for a row that does
     /// not exist.
     virtual std::string_view GetRowUtf8(int row) const = 0;
+    /// The block of text that holds the rows, line for row, when the source keeps one: a
+    /// reader that keeps many rows can share its bytes (TextLines::SharingBlocksOf). Null
+    /// when the rows are kept otherwise.
+    virtual const nedit::TextLines* GetLines() const { return nullptr; }
 
     /// Puts `text` through the gate of every row (NormaliseRow) and, when the result is not
     /// empty, inserts it at `row` (a row past the end appends). Gives the row, or -1.

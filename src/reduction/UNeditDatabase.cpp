@@ -159,12 +159,21 @@ void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRo
 }
 
 nedit::TextLines UNeditDatabase::ContentRows() const {
-    nedit::TextLines rows;
-    if (Rows == nullptr || Doc == nullptr) return rows;
+    if (Rows == nullptr || Doc == nullptr) return nedit::TextLines();
+    // Rows that are as the reduction reads them are shared with the list, not copied.
+    const nedit::TextLines* lines = Rows->GetLines();
+    nedit::TextLines rows =
+        lines != nullptr ? nedit::TextLines::SharingBlocksOf(*lines) : nedit::TextLines();
     std::string buffer;
     for (int row = 0; row < Rows->GetItemCount(); ++row) {
-        const std::string_view text = RowAsRead(Rows->GetRowUtf8(row), buffer);
-        if (IsContentType(Doc->GetRecordTypeUtf8(text))) rows.push_back(text);
+        const std::string_view stored = Rows->GetRowUtf8(row);
+        const std::string_view text = RowAsRead(stored, buffer);
+        if (!IsContentType(Doc->GetRecordTypeUtf8(text))) continue;
+        if (lines != nullptr && text.data() == stored.data() && text.size() == stored.size()) {
+            rows.PushShared(*lines, static_cast<std::size_t>(row));
+        } else {
+            rows.push_back(text);
+        }
     }
     return rows;
 }

@@ -58,7 +58,7 @@ Statement& Statement::BindBlob(int index, std::string_view bytes) {
         throw JobError("a stream of more than 2 GB cannot be stored in a job");
     }
     if (sqlite3_bind_blob(stmt_, index, bytes.data(), static_cast<int>(bytes.size()),
-                          SQLITE_TRANSIENT) != SQLITE_OK) {
+                          SQLITE_STATIC) != SQLITE_OK) {
         Throw(db_, "bind");
     }
     return *this;
@@ -121,10 +121,14 @@ std::wstring Statement::Text(int column) const {
 }
 
 std::string Statement::Bytes(int column) const {
+    return std::string(BytesView(column));
+}
+
+std::string_view Statement::BytesView(int column) const {
     const void* data = sqlite3_column_blob(stmt_, column);
     if (data == nullptr) return {};
-    return std::string(static_cast<const char*>(data),
-                       static_cast<std::size_t>(sqlite3_column_bytes(stmt_, column)));
+    return std::string_view(static_cast<const char*>(data),
+                            static_cast<std::size_t>(sqlite3_column_bytes(stmt_, column)));
 }
 
 double Statement::Height(int column) const {

@@ -32,6 +32,8 @@ class Statement {
         return Bind(index, std::wstring_view(text));
     }
     Statement& BindUtf8(int index, std::string_view text);
+    /// The bytes are not copied (a stream may be large): they must stay as they are until
+    /// the statement has run.
     Statement& BindBlob(int index, std::string_view bytes);
     Statement& BindNull(int index);
     /// An identifier of 0 ("none") goes in as NULL, so foreign keys see no reference.
@@ -54,6 +56,8 @@ class Statement {
     bool IsNull(int column) const;
     std::wstring Text(int column) const;
     std::string Bytes(int column) const;
+    /// The same where SQLite holds them, good until the statement steps on or is reset.
+    std::string_view BytesView(int column) const;
     /// NULL reads back as kNoHeight.
     double Height(int column) const;
 

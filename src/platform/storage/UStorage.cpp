@@ -153,24 +153,29 @@ int UStorage::RenameElement(const std::wstring& from, const std::wstring& to) {
 }
 
 bool UStorage::ReadStream(const std::wstring& name, std::string& bytes) const {
+    return ReadStream(name, [&bytes](std::string_view stored) { bytes.assign(stored); });
+}
+
+bool UStorage::ReadStream(const std::wstring& name,
+                          const std::function<void(std::string_view)>& read) const {
     if (!IsOpen()) return false;
     const auto held = pending_.find(name);
     if (held != pending_.end()) {
         if (!held->second) return false;
-        bytes = *held->second;
+        read(*held->second);
         return true;
     }
     auto query = job_->Query("SELECT data FROM stream WHERE storage_id = ? AND name = ?");
     query->Bind(1, id_).Bind(2, name);
     if (!query->Step()) return false;
-    bytes = query->Bytes(0);
+    read(query->BytesView(0));
     return true;
 }
 
-void UStorage::WriteStream(const std::wstring& name, const std::string& bytes) {
+void UStorage::WriteStream(const std::wstring& name, std::string bytes) {
     job_->RequireWritable();
     if (transacted_) {
-        pending_[name] = bytes;
+        pending_[name] = std::move(bytes);
         return;
     }
     auto write = job_->Query(

@@ -11,9 +11,11 @@
 // Refusals that callers expect (no such element, a name already taken, a storage that is
 // not open) give 0. Failures of the database throw nedit::JobError.
 
+#include <functional>
 #include <map>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace nedit {
@@ -84,8 +86,12 @@ class UStorage {
     /// The stream's bytes as this storage sees them (held-back writes included); false when
     /// there is no such stream.
     bool ReadStream(const std::wstring& name, std::string& bytes) const;
-    /// Stores the stream's bytes (held back in a transacted storage).
-    void WriteStream(const std::wstring& name, const std::string& bytes);
+    /// The same bytes, handed to `read` where they lie, without a copy (a large stream is
+    /// read this way); good only during the call. False when there is no such stream.
+    bool ReadStream(const std::wstring& name,
+                    const std::function<void(std::string_view)>& read) const;
+    /// Stores the stream's bytes (held back in a transacted storage, without a copy).
+    void WriteStream(const std::wstring& name, std::string bytes);
     bool CanWrite() const;
 
   private:

@@ -85,7 +85,7 @@ void UStreamFile::Close() {
         bytes.swap(data_);
         position_ = 0;
         dirty_ = false;
-        storage->WriteStream(name_, bytes);
+        storage->WriteStream(name_, std::move(bytes));
     }
     data_.clear();
     position_ = 0;

@@ -37,6 +37,8 @@ class UStreamFile {
     /// Up to `count` bytes from the current position; gives how many were read.
     std::size_t Read(void* buffer, std::size_t count);
     void Write(const void* data, std::size_t count);
+    /// Room for `bytes` bytes to be written without the stream growing.
+    void Reserve(std::size_t bytes) { data_.reserve(bytes); }
 
     std::size_t GetLength() const { return data_.size(); }
     std::size_t GetPosition() const { return position_; }

@@ -34,7 +34,7 @@ std::uint64_t TextLines::Store(std::string_view line) {
     if (line.size() > kMaxLineBytes) line = line.substr(0, kMaxLineBytes);
     if (Blocks.empty() || line.size() > kBlockBytes - BlockUsed) {
         // `line` may lie in a block; blocks stay where they are, so it stays good.
-        Blocks.push_back(std::make_unique<char[]>(kBlockBytes));
+        Blocks.push_back(std::shared_ptr<char[]>(new char[kBlockBytes]));
         BlockUsed = 0;
     }
     const std::uint64_t block = Blocks.size() - 1;
@@ -43,6 +43,19 @@ std::uint64_t TextLines::Store(std::string_view line) {
     BlockUsed += line.size();
     Live += line.size();
     return block << (kLengthBits + kOffsetBits) | offset << kLengthBits | line.size();
+}
+
+TextLines TextLines::SharingBlocksOf(const TextLines& other) {
+    TextLines lines;
+    lines.Blocks = other.Blocks;
+    // The last of them is another's to fill: lines of this one's own go to a new block.
+    lines.BlockUsed = kBlockBytes;
+    return lines;
+}
+
+void TextLines::PushShared(const TextLines& other, std::size_t line) {
+    Refs.push_back(other.Refs[line]);
+    Live += LengthOf(other.Refs[line]);
 }
 
 void TextLines::push_back(std::string_view line) {

@@ -7,6 +7,10 @@
 //
 // A line's view is good until the lines next change. Replacing or removing a line leaves its
 // old bytes behind until they outweigh the live text; the blocks are then written anew.
+//
+// Bytes once written to a block never change, so lines can share blocks: a copy of some of the
+// lines of another TextLines (SharingBlocksOf, PushShared) costs eight bytes a line and keeps
+// the blocks it needs alive.
 
 #include <cstddef>
 #include <cstdint>
@@ -38,6 +42,12 @@ class TextLines {
     /// Room for `lines` lines without growing the table.
     void reserve(std::size_t lines) { Refs.reserve(lines); }
 
+    /// No lines yet, but the blocks of `other`, so that its lines can be taken over without
+    /// their bytes being copied. Lines added otherwise go to blocks of its own.
+    static TextLines SharingBlocksOf(const TextLines& other);
+    /// Appends line `line` of `other`, whose blocks this was made sharing, without a copy.
+    void PushShared(const TextLines& other, std::size_t line);
+
   private:
     /// Copies the bytes into the blocks and gives the line's reference: the block in the high
     /// 22 bits, the offset in it in the next 21, the length in the low 21.
@@ -45,7 +55,7 @@ class TextLines {
     void CompactWhenWasteful();
 
     static constexpr std::size_t kBlockBytes = std::size_t{1} << 21;
-    std::vector<std::unique_ptr<char[]>> Blocks;
+    std::vector<std::shared_ptr<char[]>> Blocks;
     std::size_t BlockUsed = kBlockBytes;  // bytes used in the last block; full when none yet
     std::vector<std::uint64_t> Refs;
     std::size_t Live = 0;     // bytes of the lines

@@ -65,3 +65,18 @@ TEST(TextLines, ManyReplacementsLeaveTheTextWhole) {
     for (int i = 0; i < 100; ++i)
         EXPECT_EQ(lines[static_cast<std::size_t>(i)], "ROW " + std::to_string(i) + " ROUND 4999");
 }
+
+TEST(TextLines, LinesSharedWithAnotherStayAsTheyWereWhateverItDoesAfter) {
+    TextLines list;
+    for (int i = 0; i < 1000; ++i) list.push_back("ROW " + std::to_string(i));
+    TextLines kept = TextLines::SharingBlocksOf(list);
+    kept.PushShared(list, 3);
+    kept.push_back("OWN");
+    kept.PushShared(list, 999);
+    // The list goes on: lines appended to its last block, replaced, erased, compacted.
+    for (int i = 0; i < 1000; ++i) list.push_back("MORE " + std::to_string(i));
+    for (int round = 0; round < 3000; ++round) list.replace(3, std::string(700, 'x'));
+    list.erase(0, 10);
+    EXPECT_EQ(All(kept), (std::vector<std::string>{"ROW 3", "OWN", "ROW 999"}));
+    EXPECT_EQ(list[0], "ROW 10");
+}
