@@ -61,3 +61,40 @@ TEST(PointStore, AnEmptyCodeKeepsTheCodeOfTheName) {
     EXPECT_EQ(store.CodeFor(L"P", L"TREE"), L"TREE");
     EXPECT_EQ(store.CodeFor(L"Q", L""), L"");
 }
+
+TEST(PointStore, SavesByAKnownIndexAndLooksNamesUpOnlyWhenAsked) {
+    nedit::PointStore store;
+    EXPECT_EQ(store.SaveAt(-1, Point(L"A", 1.0, false)), 0u);
+    EXPECT_EQ(store.SaveAt(-1, Point(L"B", 2.0, true)), 1u);
+    EXPECT_EQ(store.SaveAt(0, Point(L"A", 3.0, false)), 0u);
+    EXPECT_EQ(store.SaveAt(0, Point(L"A", 4.0, true)), 0u);  // a PT record keeps off
+    EXPECT_DOUBLE_EQ(store[0].x, 3.0);
+    // The look-up by name, made now, follows later saves.
+    EXPECT_EQ(store.IndexOf(L"B"), 1);
+    EXPECT_EQ(store.SaveAt(-1, Point(L"C", 5.0, false)), 2u);
+    EXPECT_EQ(store.IndexOf(L"C"), 2);
+}
+
+TEST(UNeditPt, CopiesCarryTheRarerMembersAndShareTheCode) {
+    UNeditPt point(L"P", 1.0, 2.0, 3.0, L"FC01", 0);
+    EXPECT_EQ(point.GetLayer(), L"");
+    EXPECT_TRUE(point.GetImages().empty());
+    point.SetLayer(L"FENCES");
+    point.SetNote(L"leaning");
+    point.SetImage(1.0, 2.0, L"p.jpg");
+    EXPECT_FALSE(point.SetPointAttribute(L"", L"TEXT", L"x"));
+    EXPECT_TRUE(point.SetPointAttribute(L"HEIGHT", L"TEXT", L"1.2"));
+    UNeditPt copy = point;
+    point.SetLayer(L"OTHER");
+    point.SetImage(3.0, 4.0, L"q.jpg");
+    EXPECT_EQ(copy.GetLayer(), L"FENCES");
+    EXPECT_EQ(copy.GetNote(), L"leaning");
+    EXPECT_EQ(copy.GetImageSize(), 1);
+    EXPECT_EQ(copy.GetPointAttributeSize(), 1);
+    EXPECT_EQ(copy.GetCode(), L"FC01");
+    EXPECT_EQ(copy.GetSharedCode(), point.GetSharedCode());
+    copy = UNeditPt(L"Q", 0.0, 0.0, 0.0, L"", 0);
+    EXPECT_EQ(copy.GetCode(), L"");
+    EXPECT_EQ(copy.GetLayer(), L"");
+    EXPECT_EQ(copy.GetID(), L"Q");
+}

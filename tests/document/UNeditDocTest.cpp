@@ -163,6 +163,42 @@ TEST_F(RawDataDocuments, AStreamReadStopsAtAnEmptyLineAndSaysSo) {
     EXPECT_EQ(empty->Save(nullptr, 0), 1);
 }
 
+// A save writes the stream again only when it does not hold the rows as the list has them;
+// whether it was written or not, the stream then holds them, a line feed after each.
+TEST_F(RawDataDocuments, ASavedStreamHoldsTheRowsAsTheListHasThem) {
+    auto stored_text = [](UNeditDoc& doc) {
+        std::string text;
+        doc.GetStorage()->ReadStream(UNeditDoc::kNeutralDataStream, text);
+        return text;
+    };
+    auto doc = std::make_unique<UNeditDoc>(job.get());
+    ASSERT_EQ(doc->CreateDocument(L"Hand", container.get()), 1);
+    UStreamFile stream;
+    ASSERT_EQ(stream.CreateStream(*doc->GetStorage(), UNeditDoc::kNeutralDataStream, 4113), 1);
+    const std::string hand = "#VERSION-1.0 NEUTRAL FILE\r\nstn id=a\r\nss id=b,ha=1\r\n";
+    stream.Write(hand.data(), hand.size());
+    stream.Close();
+    const std::string laid_out = "#VERSION-1.0 NEUTRAL FILE\nSTN       ID=A\nSS        ID=B,HA=1\n";
+    UListCtrl& list = doc->OpenList();
+    ASSERT_EQ(doc->SaveDocument(), 1);
+    EXPECT_EQ(stored_text(*doc), laid_out);
+    // Saved again unchanged, and after a row was added.
+    ASSERT_EQ(doc->SaveDocument(), 1);
+    EXPECT_EQ(stored_text(*doc), laid_out);
+    list.AddRecord(list.GetItemCount(), L"ss id=c");
+    ASSERT_EQ(doc->SaveDocument(), 1);
+    EXPECT_EQ(stored_text(*doc), laid_out + "SS        ID=C\n");
+    // A document read again from a stream that holds its rows saves them as they are.
+    doc.reset();
+    Reopen();
+    UNeditDoc* again = container->GetNeditDoc(L"Hand");
+    ASSERT_NE(again, nullptr);
+    again->OpenList().SetRecord(1, L"stn id=z");
+    ASSERT_EQ(again->SaveDocument(), 1);
+    EXPECT_EQ(stored_text(*again),
+              "#VERSION-1.0 NEUTRAL FILE\nSTN       ID=Z\nSS        ID=B,HA=1\nSS        ID=C\n");
+}
+
 TEST_F(RawDataDocuments, AJobHolds1023DocumentsAndNoMore) {
     UStorage* storage = container->GetStorage();
     ASSERT_NE(storage, nullptr);
