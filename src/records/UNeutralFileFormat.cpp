@@ -362,23 +362,24 @@ int UNeutralFileFormat::GetStringCount(const std::wstring& text, wchar_t c) cons
     return nedit::CountOf(text, c);
 }
 
+int UNeutralFileFormat::SlotOf(int id) const {
+    int slot = -1;
+    if (id >= 0 && static_cast<std::size_t>(id) < slot_of_id_.size()) {
+        slot = slot_of_id_[static_cast<std::size_t>(id)];
+    } else if (const FieldDefinition* field = definition_.FieldById(id)) {
+        slot = field->slot;
+    }
+    return slot >= 0 && static_cast<std::size_t>(slot) < current_.size() ? slot : -1;
+}
+
 UNeutralFileFormat::CurrentValue* UNeutralFileFormat::CurrentOf(int id) {
-    const int slot = id >= 0 && static_cast<std::size_t>(id) < slot_of_id_.size()
-                         ? slot_of_id_[static_cast<std::size_t>(id)]
-                     : definition_.FieldById(id) != nullptr ? definition_.FieldById(id)->slot
-                                                            : -1;
-    if (slot >= 0 && static_cast<std::size_t>(slot) < current_.size())
-        return &current_[static_cast<std::size_t>(slot)];
-    return &other_current_[id];
+    const int slot = SlotOf(id);
+    return slot >= 0 ? &current_[static_cast<std::size_t>(slot)] : &other_current_[id];
 }
 
 const UNeutralFileFormat::CurrentValue* UNeutralFileFormat::CurrentOf(int id) const {
-    const int slot = id >= 0 && static_cast<std::size_t>(id) < slot_of_id_.size()
-                         ? slot_of_id_[static_cast<std::size_t>(id)]
-                     : definition_.FieldById(id) != nullptr ? definition_.FieldById(id)->slot
-                                                            : -1;
-    if (slot >= 0 && static_cast<std::size_t>(slot) < current_.size())
-        return &current_[static_cast<std::size_t>(slot)];
+    const int slot = SlotOf(id);
+    if (slot >= 0) return &current_[static_cast<std::size_t>(slot)];
     const auto found = other_current_.find(id);
     return found == other_current_.end() ? nullptr : &found->second;
 }

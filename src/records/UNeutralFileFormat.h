@@ -159,6 +159,8 @@ class UNeutralFileFormat {
     RecordValue ValueOf(FieldKind kind, std::string_view text) const;
     const FieldDefinition* FieldOfKey(std::wstring_view key) const;
     const FieldDefinition* FieldOfKey(std::string_view key) const;
+    /// Where the current value of a field is kept, or -1 for a field the definition lacks.
+    int SlotOf(int id) const;
     CurrentValue* CurrentOf(int id);
     const CurrentValue* CurrentOf(int id) const;
     void StartCurrentValues();

@@ -38,22 +38,7 @@ int UNeditDatabase::FindCoordOf(NameId name, double& e, double& n, double& z, st
     for (std::uint32_t node = FirstNodeOf(name); node != NodeEntry::kNone;
          node = Nodes[node].NextSameName) {
         int fixed = 0;
-        if (Nodes[node].IsPointOnly()) {
-            const PointNode& point = PointNodes[Nodes[node].Index()];
-            e = point.East;
-            n = point.North;
-            z = point.Height;
-            code = CodeText(point.Code);
-            fixed = point.CoordFixed;
-        } else {
-            const STNSTRUCT& station = Setups[Nodes[node].Index()];
-            code = station.StnCode;
-            if (!station.CoordKnown) continue;
-            e = station.East;
-            n = station.North;
-            z = station.Height;
-            fixed = station.CoordFixed;
-        }
+        if (!NodeCoordinates(node, e, n, z, code, fixed)) continue;
         if (fixed == 1 || fix == 0) return 1;
         break;
     }
@@ -217,25 +202,37 @@ int UNeditDatabase::SetCoordOf(NameId name, double e, double n, double z, std::w
 
 int UNeditDatabase::GetCoordFromStnList(const std::wstring& name, double& e, double& n, double& z,
                                         std::wstring& code) const {
+    int fixed = 0;
+    std::wstring node_code;
     for (std::uint32_t node = FirstNodeOf(Names.Find(name)); node != NodeEntry::kNone;
          node = Nodes[node].NextSameName) {
-        if (Nodes[node].IsPointOnly()) {
-            const PointNode& point = PointNodes[Nodes[node].Index()];
-            e = point.East;
-            n = point.North;
-            z = point.Height;
-            code = CodeText(point.Code);
+        if (NodeCoordinates(node, e, n, z, node_code, fixed)) {
+            code = node_code;
             return 1;
         }
-        const STNSTRUCT& station = Setups[Nodes[node].Index()];
-        if (!station.CoordKnown) continue;
-        e = station.East;
-        n = station.North;
-        z = station.Height;
-        code = station.StnCode;
-        return 1;
     }
     return 0;
+}
+
+bool UNeditDatabase::NodeCoordinates(std::uint32_t node, double& e, double& n, double& z,
+                                     std::wstring& code, int& fixed) const {
+    if (Nodes[node].IsPointOnly()) {
+        const PointNode& point = PointNodes[Nodes[node].Index()];
+        e = point.East;
+        n = point.North;
+        z = point.Height;
+        code = CodeText(point.Code);
+        fixed = point.CoordFixed;
+        return true;
+    }
+    const STNSTRUCT& station = Setups[Nodes[node].Index()];
+    code = station.StnCode;
+    if (!station.CoordKnown) return false;
+    e = station.East;
+    n = station.North;
+    z = station.Height;
+    fixed = station.CoordFixed;
+    return true;
 }
 
 int UNeditDatabase::GetPointFromPtList(const std::wstring& name, double& e, double& n, double& z,

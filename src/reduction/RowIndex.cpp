@@ -109,13 +109,17 @@ void RowIndex::Make(const nedit::RowSource& rows) {
     Made = true;
 }
 
+std::size_t RowIndex::PositionOf(std::uint32_t row) const {
+    return static_cast<std::size_t>(
+        std::lower_bound(Members.begin(), Members.end(), row,
+                         [](const Member& member, std::uint32_t r) { return member.Row < r; }) -
+        Members.begin());
+}
+
 void RowIndex::Inserted(const nedit::RowSource& rows, int row, std::uint64_t before) {
     if (!InSync(rows, before)) return;
     const auto at = static_cast<std::uint32_t>(row);
-    const auto position = static_cast<std::size_t>(
-        std::lower_bound(Members.begin(), Members.end(), at,
-                         [](const Member& member, std::uint32_t r) { return member.Row < r; }) -
-        Members.begin());
+    const std::size_t position = PositionOf(at);
     for (std::size_t p = position; p < Members.size(); ++p) ++Members[p].Row;
     std::vector<int> named;
     nedit::NameTable::Id name = nedit::NameTable::kNone;
@@ -127,10 +131,7 @@ void RowIndex::Replaced(const nedit::RowSource& rows, int row, std::string_view 
                         std::uint64_t before) {
     if (!InSync(rows, before)) return;
     const auto at = static_cast<std::uint32_t>(row);
-    const auto position = static_cast<std::size_t>(
-        std::lower_bound(Members.begin(), Members.end(), at,
-                         [](const Member& member, std::uint32_t r) { return member.Row < r; }) -
-        Members.begin());
+    const std::size_t position = PositionOf(at);
     const bool was = position < Members.size() && Members[position].Row == at;
     std::vector<int> named;
     nedit::NameTable::Id name = nedit::NameTable::kNone;

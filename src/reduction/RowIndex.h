@@ -56,6 +56,8 @@ class RowIndex {
     };
 
     bool InSync(const nedit::RowSource& rows, std::uint64_t revision) const;
+    /// The place among the members of the first at or after `row`.
+    std::size_t PositionOf(std::uint32_t row) const;
     void Make(const nedit::RowSource& rows);
     /// The row's text as the walk reads it (trimmed, upper case) and its type when it is one of
     /// the types, else 0.

@@ -314,6 +314,10 @@ class UNeditDatabase {
     std::uint32_t FirstNodeOf(NameId name) const;
     STNSTRUCT* FirstSetupOf(NameId name) const;
     std::vector<STNSTRUCT*> OccupiedStations(NameId name, const STNSTRUCT* observer) const;
+    /// The coordinates of a node that knows them, its code and fix value; for a node that
+    /// does not, only its code, and false.
+    bool NodeCoordinates(std::uint32_t node, double& e, double& n, double& z, std::wstring& code,
+                         int& fixed) const;
     void AppendForward(STNSTRUCT& station, const SSSTRUCT& target);
 
     // The coordinate sources by name id (CoordLookup.cpp).

@@ -107,41 +107,37 @@ bool WriteReductionJson(const UNeditDatabase& engine, const std::vector<std::wst
         });
         points.End();
     }
-    out += ",\n  \"lines\": ";
-    {
-        json::RowWriter lines(out, 2);
-        for (const UNeditLine& line : engine.GetLineList()) {
-            lines.Row(json::Inline({{"from", json::Text(line.GetFromPt())},
-                                    {"to", json::Text(line.GetToPt())},
-                                    {"station_line", line.GetStationLine() != 0}}));
+    // A member that is an array of rows; an item that gives no row is left out.
+    auto member = [&](const char* name, const auto& items, auto row) {
+        out += ",\n  \"";
+        out += name;
+        out += "\": ";
+        json::RowWriter rows(out, 2);
+        for (const auto& item : items) {
+            const std::string text = row(item);
+            if (text.empty()) continue;
+            rows.Row(text);
             flush(false);
         }
-        lines.End();
-    }
-    out += ",\n  \"arcs\": ";
-    {
-        json::RowWriter arcs(out, 2);
-        for (const UNeditArc& arc : engine.GetArcList()) {
-            arcs.Row(json::Inline({{"start", json::Text(arc.GetStartPt())},
-                                   {"end", json::Text(arc.GetEndPt())},
-                                   {"third", json::Text(arc.GetThirdPt())},
-                                   {"type", arc.GetArcType()}}));
-            flush(false);
-        }
-        arcs.End();
-    }
-    out += ",\n  \"circles\": ";
-    {
-        json::RowWriter circles(out, 2);
-        for (const UWCircle& circle : engine.GetCircleList()) {
-            if (!IsFinite(circle)) continue;
-            circles.Row(json::Inline({{"e", circle.GetCentre().x},
-                                      {"n", circle.GetCentre().y},
-                                      {"radius", circle.GetRadius()}}));
-            flush(false);
-        }
-        circles.End();
-    }
+        rows.End();
+    };
+    member("lines", engine.GetLineList(), [](const UNeditLine& line) {
+        return json::Inline({{"from", json::Text(line.GetFromPt())},
+                             {"to", json::Text(line.GetToPt())},
+                             {"station_line", line.GetStationLine() != 0}});
+    });
+    member("arcs", engine.GetArcList(), [](const UNeditArc& arc) {
+        return json::Inline({{"start", json::Text(arc.GetStartPt())},
+                             {"end", json::Text(arc.GetEndPt())},
+                             {"third", json::Text(arc.GetThirdPt())},
+                             {"type", arc.GetArcType()}});
+    });
+    member("circles", engine.GetCircleList(), [](const UWCircle& circle) {
+        if (!IsFinite(circle)) return std::string();
+        return json::Inline({{"e", circle.GetCentre().x},
+                             {"n", circle.GetCentre().y},
+                             {"radius", circle.GetRadius()}});
+    });
     json::Value said = json::Value::array();
     for (const std::wstring& message : messages) said.push_back(json::Text(message));
     out += ",\n  \"error\": " + std::to_string(engine.GetErrorCode());
