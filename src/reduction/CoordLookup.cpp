@@ -276,6 +276,8 @@ int UNeditDatabase::FindCoordinateRow(const nedit::RowSource& rows, const std::w
         *n = Number(fld::N);
         *z = Number(fld::H);
     }
+    // The fields are views into the rows, which the caller may change next.
+    Fields.clear();
     return row;
 }
 

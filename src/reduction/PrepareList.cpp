@@ -97,6 +97,8 @@ int UNeditDatabase::PrepareRows(std::size_t count, RowAt rowAt) {
     }
     TravFlag = 0;
     Filing = false;
+    // The fields are views into the rows read: no record is in hand after the pass.
+    Fields.clear();
     // What a repeated observation needed to find its target is not needed after the pass.
     FiledBackSights = std::vector<FiledTarget>();
     FiledSideShots = std::vector<FiledTarget>();

@@ -119,7 +119,8 @@ class UNeditDatabase {
     int PrepareList(const std::vector<std::wstring>& rows);
     int ProcessRecord(int type, const std::wstring& row, int recordNo);
     /// The field from the record in hand, or its current value when absent or empty.
-    /// Valid until the next record is parsed.
+    /// Valid until the next record is parsed. A record is in hand only while the rows are
+    /// read; after that every field gives its current value.
     const std::wstring& GetValue(int id) const;
     /// Appends `station`, a node of this engine's (the station in hand, or one this engine
     /// made), to the list, with the current modes and units.
