@@ -11,6 +11,7 @@
 #include <fstream>
 #include <nlohmann/json.hpp>
 #include <string>
+#include <string_view>
 
 #include "RecordSession.h"
 #include "ReductionOutput.h"
@@ -53,9 +54,17 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     if (!engine.LoadNeFile(nedit::FromUtf8(input_path))) return 0;
     engine.Process();
 
-    Require(nedit::IsValidUtf8(nedit::ToUtf8(session.report->GetText())),
-            "the report is not valid UTF-8");
-    const std::string text = ReductionJson(engine, session.host.Messages());
+    std::string report;
+    session.report->WriteUtf8([&report](std::string_view piece) {
+        report += piece;
+        return true;
+    });
+    Require(nedit::IsValidUtf8(report), "the report is not valid UTF-8");
+    std::string text;
+    WriteReductionJson(engine, session.host.Messages(), [&text](std::string_view piece) {
+        text += piece;
+        return true;
+    });
     Require(nedit::IsValidUtf8(text), "the JSON is not valid UTF-8");
     const nlohmann::json json = nlohmann::json::parse(text, nullptr, false);
     Require(!json.is_discarded(), "the JSON does not parse");
