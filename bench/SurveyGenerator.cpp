@@ -180,8 +180,10 @@ void Generator::Station(int index, const Position& here, const Position* back,
                 target_height, code);
         }
         if (Shape.offsetEvery > 0 && ++SideShots % Shape.offsetEvery == 0) {
-            Line(Printf("OFFSET    OA=%.3f,OR=%.3f,OU=%.3f", Uniform(-0.5, 0.5), Uniform(-0.5, 0.5),
-                        0.0));
+            // Drawn one after the other: the order of a call's arguments is the compiler's.
+            const double along = Uniform(-0.5, 0.5);
+            const double right = Uniform(-0.5, 0.5);
+            Line(Printf("OFFSET    OA=%.3f,OR=%.3f,OU=%.3f", along, right, 0.0));
         }
     }
 }

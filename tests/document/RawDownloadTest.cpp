@@ -30,9 +30,10 @@ class RawDownload : public InstrumentDocFixture {
     }
     int Download() { return doc.Download(nedit::FromUtf8(raw), &list); }
 
-    FakeInstrument instrument;
     std::string raw = dir.File("OUTTEMP.$$$");
     std::string rilievo;
+    // Last, so that it is gone first: its thread, which reads the text above, is joined then.
+    FakeInstrument instrument;
 };
 
 TEST_F(RawDownload, ABlockAtATimeThenTheTimeOutEndsIt) {
