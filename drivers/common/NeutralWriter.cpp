@@ -1,0 +1,148 @@
+#include "NeutralWriter.h"
+
+#include <utility>
+
+namespace sxn {
+
+namespace {
+
+constexpr const char* kHeader = "#VERSION-1.0 NEUTRAL FILE";
+constexpr double kNoValue = -10000.0;
+constexpr std::size_t kShown = 200;
+
+std::string Field(const char* key, const std::string& value) {
+    return std::string(",") + key + "=" + value;
+}
+
+}  // namespace
+
+std::string FieldText(std::string_view text) {
+    std::string out = CommentText(text);
+    for (char& c : out) {
+        if (c == ',' || c == '=') c = '_';
+    }
+    const std::size_t first = out.find_first_not_of(' ');
+    if (first == std::string::npos) return {};
+    return out.substr(first, out.find_last_not_of(' ') - first + 1);
+}
+
+std::string CommentText(std::string_view bytes) {
+    std::string out = LineToUtf8(bytes);
+    for (char& c : out) {
+        if (static_cast<unsigned char>(c) < 0x20 || c == 0x7F) c = ' ';
+    }
+    return out;
+}
+
+NeutralWriter::NeutralWriter(OutputUnits units, std::string tag, std::string name, Sink record,
+                             Sink message)
+    : units_(units),
+      tag_(std::move(tag)),
+      name_(std::move(name)),
+      record_(std::move(record)),
+      message_(std::move(message)) {}
+
+void NeutralWriter::Prove() {
+    if (proven_ || refused_) return;
+    proven_ = true;
+    for (const std::string& text : held_) Out(text);
+    held_.clear();
+}
+
+void NeutralWriter::Record(std::string text) {
+    if (refused_) return;
+    if (proven_) {
+        Out(text);
+    } else {
+        held_.push_back(std::move(text));
+    }
+}
+
+void NeutralWriter::Out(const std::string& text) {
+    if (!started_) {
+        started_ = true;
+        record_(kHeader);
+        record_(units_.UnitRecord());
+    }
+    record_(text);
+}
+
+void NeutralWriter::Comment(std::string_view text) {
+    Record("# " + CommentText(text));
+}
+
+void NeutralWriter::Unread(long line, std::string_view bytes) {
+    if (refused_) return;
+    ++unread_;
+    Record("# " + tag_ + " LINE " + std::to_string(line) +
+           " NOT READ: " + Printable(CommentText(bytes), kShown));
+}
+
+std::string NeutralWriter::LengthText(const std::optional<Length>& length) const {
+    return length ? length->Text(units_.length) : Fixed(kNoValue, 3);
+}
+
+void NeutralWriter::Station(const std::string& id, const std::optional<Length>& height,
+                            const std::string& code) {
+    std::string record = "STN ID=" + id;
+    if (height) record += Field("HI", height->Text(units_.length));
+    Record(record + Field("CO", code));
+}
+
+void NeutralWriter::Xyz(const std::string& id, const Coordinates& at) {
+    Record("XYZ ID=" + id + Field("E", LengthText(at.east)) + Field("N", LengthText(at.north)) +
+           Field("H", LengthText(at.height)));
+}
+
+void NeutralWriter::Point(const std::string& id, const Coordinates& at, const std::string& code) {
+    Record("PT ID=" + id + Field("E", LengthText(at.east)) + Field("N", LengthText(at.north)) +
+           Field("H", LengthText(at.height)) + Field("CO", code));
+}
+
+void NeutralWriter::Observe(const Observation& observation) {
+    std::string record = (observation.back_sight ? "BS ID=" : "SS ID=") + observation.id +
+                         Field("HA", observation.horizontal.Text(units_.angle)) +
+                         Field("VA", observation.zenith.Text(units_.angle)) +
+                         Field("SD", observation.slope.Text(units_.length));
+    if (observation.target_height) record += Field("HT", LengthText(observation.target_height));
+    record += Field("CO", observation.code);
+    if (observation.horizontal_distance)
+        record += Field("HD", LengthText(observation.horizontal_distance));
+    if (observation.height_difference)
+        record += Field("VD", LengthText(observation.height_difference));
+    Record(record);
+}
+
+void NeutralWriter::BackBearing(const std::string& id, const std::optional<Angle>& bearing,
+                                const std::optional<Angle>& reading) {
+    std::string record = "BKB ID=" + id;
+    if (bearing) record += Field("BRG", bearing->Text(units_.angle));
+    if (reading) record += Field("HA", reading->Text(units_.angle));
+    Record(record);
+}
+
+void NeutralWriter::InstrumentHeight(const Length& height) {
+    Record("INSHT " + height.Text(units_.length));
+}
+
+void NeutralWriter::TargetHeight(const Length& height) {
+    Record("TARGETHT " + height.Text(units_.length));
+}
+
+void NeutralWriter::NotFormat() {
+    if (refused_) return;
+    refused_ = true;
+    held_.clear();
+    unread_ = 0;
+    message_("The data are not " + name_ + ": no " + tag_ + " record was found in them.");
+}
+
+void NeutralWriter::Finish() {
+    if (!proven_ && !held_.empty()) NotFormat();
+    if (unread_ > 0) {
+        message_(std::to_string(unread_) + (unread_ == 1 ? " line" : " lines") + " of the " + tag_ +
+                 " data could not be read; they stand as comments that name their lines.");
+    }
+}
+
+}  // namespace sxn
