@@ -84,6 +84,7 @@ std::string NeutralWriter::LengthText(const std::optional<Length>& length) const
 
 void NeutralWriter::Station(const std::string& id, const std::optional<Length>& height,
                             const std::string& code) {
+    if (!id.empty()) station_seen_ = true;
     std::string record = "STN ID=" + id;
     if (height) record += Field("HI", height->Text(units_.length));
     Record(record + Field("CO", code));
@@ -100,6 +101,7 @@ void NeutralWriter::Point(const std::string& id, const Coordinates& at, const st
 }
 
 void NeutralWriter::Observe(const Observation& observation) {
+    if (!station_seen_) observed_before_station_ = true;
     std::string record = (observation.back_sight ? "BS ID=" : "SS ID=") + observation.id +
                          Field("HA", observation.horizontal.Text(units_.angle)) +
                          Field("VA", observation.zenith.Text(units_.angle)) +
@@ -139,6 +141,11 @@ void NeutralWriter::NotFormat() {
 
 void NeutralWriter::Finish() {
     if (!proven_ && !held_.empty()) NotFormat();
+    if (observed_before_station_ && !refused_) {
+        message_(
+            "The data hold observations before any station with a name; they are reduced only "
+            "once a STN record with a name stands before them.");
+    }
     if (unread_ > 0) {
         message_(std::to_string(unread_) + (unread_ == 1 ? " line" : " lines") + " of the " + tag_ +
                  " data could not be read; they stand as comments that name their lines.");

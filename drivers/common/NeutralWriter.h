@@ -7,6 +7,7 @@
 // - Records are held back until the data have shown that they are of the driver's format
 //   (Prove). Data that never do (the driver's session gives up after kProbeBytes, or they end
 //   first) give no records at all, only the message "The data are not <format>: ...".
+// - Observations before any station cannot be reduced: the user is told so at the end.
 // - A line that cannot be read becomes the comment "# <TAG> LINE n NOT READ: <text>" and is
 //   counted; the count goes to the user at the end.
 // - A coordinate without a value (no height) is written as -10000, which means none; an
@@ -102,6 +103,8 @@ class NeutralWriter {
     bool refused_ = false;
     bool started_ = false;
     std::vector<std::string> held_;
+    bool station_seen_ = false;
+    bool observed_before_station_ = false;
     long unread_ = 0;
 };
 

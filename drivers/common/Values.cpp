@@ -63,6 +63,11 @@ LengthIn SameLength(LengthOut unit) {
     }
 }
 
+double Turn(double degrees) {
+    const double turned = std::fmod(degrees, 360.0);
+    return turned < 0.0 ? turned + 360.0 : turned;
+}
+
 bool ReadNumber(std::string_view text, double& value) {
     text = Trim(text);
     if (!text.empty() && text.front() == '+') text.remove_prefix(1);

@@ -25,6 +25,9 @@ enum class LengthIn { Metres, Feet, UsFeet };
 /// The unit in which a length is written as the records want it.
 LengthIn SameLength(LengthOut unit);
 
+/// An angle in degrees brought into 0 up to 360.
+double Turn(double degrees);
+
 /// A decimal number: blanks around it, an optional sign, digits with at most one point.
 /// False for anything else, whatever the user's locale.
 bool ReadNumber(std::string_view text, double& value);

@@ -8,12 +8,6 @@ namespace {
 
 constexpr double kPi = 3.14159265358979323846;
 
-// An angle in degrees brought into 0 up to 360.
-double Turn(double degrees) {
-    const double turned = std::fmod(degrees, 360.0);
-    return turned < 0.0 ? turned + 360.0 : turned;
-}
-
 }  // namespace
 
 Rw5Translator::Rw5Translator(sxn::NeutralWriter& out)
@@ -150,15 +144,15 @@ bool Rw5Translator::Observe(const Rw5Record& record, bool back_sight) {
     if (record.Has("AR")) {
         horizontal = ReadAngle(record.Value("AR"));
     } else if (const auto left = ReadAngle(record.Value("AL"))) {
-        horizontal = sxn::Angle::FromDegrees(Turn(360.0 - left->Degrees()));
+        horizontal = sxn::Angle::FromDegrees(sxn::Turn(360.0 - left->Degrees()));
     } else if (const auto right = ReadAngle(record.Value("DR"))) {
-        horizontal = sxn::Angle::FromDegrees(Turn(180.0 + right->Degrees()));
+        horizontal = sxn::Angle::FromDegrees(sxn::Turn(180.0 + right->Degrees()));
     } else if (const auto deflection = ReadAngle(record.Value("DL"))) {
-        horizontal = sxn::Angle::FromDegrees(Turn(180.0 - deflection->Degrees()));
+        horizontal = sxn::Angle::FromDegrees(sxn::Turn(180.0 - deflection->Degrees()));
     } else if (const auto azimuth = ReadAzimuth(record.Value("AZ")); azimuth && back_azimuth_) {
         const double circle = back_circle_ ? back_circle_->Degrees() : 0.0;
-        horizontal =
-            sxn::Angle::FromDegrees(Turn(circle + azimuth->Degrees() - back_azimuth_->Degrees()));
+        horizontal = sxn::Angle::FromDegrees(
+            sxn::Turn(circle + azimuth->Degrees() - back_azimuth_->Degrees()));
     }
     if (!horizontal) return false;
     observation.horizontal = *horizontal;
@@ -224,5 +218,5 @@ std::optional<sxn::Angle> Rw5Translator::ReadAngle(std::string_view text) const 
 std::optional<sxn::Angle> Rw5Translator::ReadAzimuth(std::string_view text) const {
     const auto azimuth = ReadAngle(text);
     if (!azimuth || !south_azimuths_) return azimuth;
-    return sxn::Angle::FromDegrees(Turn(azimuth->Degrees() + 180.0));
+    return sxn::Angle::FromDegrees(sxn::Turn(azimuth->Degrees() + 180.0));
 }
