@@ -1,5 +1,6 @@
 #include "NeutralWriter.h"
 
+#include <cmath>
 #include <utility>
 
 namespace sxn {
@@ -9,12 +10,37 @@ namespace {
 constexpr const char* kHeader = "#VERSION-1.0 NEUTRAL FILE";
 constexpr double kNoValue = -10000.0;
 constexpr std::size_t kShown = 200;
+constexpr double kDegrees = 180.0 / 3.14159265358979323846;
 
 std::string Field(const char* key, const std::string& value) {
     return std::string(",") + key + "=" + value;
 }
 
 }  // namespace
+
+void CompleteSight(Observation& sight, const std::optional<Angle>& zenith,
+                   const std::optional<Length>& slope, const std::optional<Length>& level,
+                   const std::optional<Length>& rise) {
+    double degrees = 90.0;
+    if (zenith) {
+        degrees = zenith->Degrees();
+    } else if (rise && (level || slope)) {
+        const double across = level ? level->Metres()
+                                    : std::sqrt(std::max(0.0, slope->Metres() * slope->Metres() -
+                                                                  rise->Metres() * rise->Metres()));
+        degrees = std::atan2(across, rise->Metres()) * kDegrees;
+    }
+    sight.zenith = zenith ? *zenith : Angle::FromDegrees(degrees);
+    if (slope) {
+        sight.slope = *slope;
+    } else if (level && rise) {
+        sight.slope = Length::FromMetres(std::hypot(level->Metres(), rise->Metres()));
+    } else if (level) {
+        sight.slope = Length::FromMetres(level->Metres() / std::sin(degrees / kDegrees));
+    } else {
+        sight.slope = *Length::Read("0.000", LengthIn::Metres);
+    }
+}
 
 std::string FieldText(std::string_view text) {
     std::string out = CommentText(text);
@@ -129,6 +155,10 @@ void NeutralWriter::InstrumentHeight(const Length& height) {
 
 void NeutralWriter::TargetHeight(const Length& height) {
     Record("TARGETHT " + height.Text(units_.length));
+}
+
+void NeutralWriter::Message(const std::string& text) {
+    if (proven_) message_(text);
 }
 
 void NeutralWriter::NotFormat() {

@@ -47,6 +47,15 @@ struct Observation {
     std::optional<Length> height_difference;
 };
 
+/// Sets the zenith angle and slope distance of `sight` from what a record gave. Without a
+/// zenith angle the sight is worked out from the height difference and the horizontal or
+/// slope distance when there are both, else taken as horizontal; without a slope distance it
+/// comes from the horizontal distance (and the height difference), else it is 0. A value left
+/// out of a record would otherwise take the value of the record before it.
+void CompleteSight(Observation& sight, const std::optional<Angle>& zenith,
+                   const std::optional<Length>& slope, const std::optional<Length>& level,
+                   const std::optional<Length>& rise);
+
 /// A name or code as a field of a neutral record: trimmed, UTF-8, without separators.
 std::string FieldText(std::string_view text);
 /// Bytes as printable UTF-8 text for a comment, control characters as blanks.
@@ -83,6 +92,9 @@ class NeutralWriter {
                      const std::optional<Angle>& reading);
     void InstrumentHeight(const Length& height);
     void TargetHeight(const Length& height);
+
+    /// A message for the user about the data, once they have shown their format.
+    void Message(const std::string& text);
 
     /// The data gave up their format: nothing held back goes out, and the user is told.
     void NotFormat();

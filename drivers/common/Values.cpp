@@ -31,8 +31,9 @@ int Decimals(std::string_view text) {
     return point == std::string_view::npos ? 0 : static_cast<int>(text.size() - point - 1);
 }
 
-// ddd.mmss to degrees; false when the minutes or seconds are 60 or more.
-bool DmsDegrees(std::string_view text, double& degrees) {
+// ddd.mmss to degrees; false when the minutes are 60 or more, or the seconds more than 60.
+// Seconds of exactly 60, an instrument's rounding, carry into the minutes: `carried` says so.
+bool DmsDegrees(std::string_view text, double& degrees, bool& carried) {
     const bool negative = text.front() == '-';
     if (negative) text.remove_prefix(1);
     const std::size_t point = text.find('.');
@@ -43,8 +44,9 @@ bool DmsDegrees(std::string_view text, double& degrees) {
     double seconds = 0.0;
     if (!ReadNumber(text.substr(0, point), whole) || !ReadNumber(fraction.substr(0, 2), minutes) ||
         !ReadNumber(fraction.substr(2, 2) + "." + fraction.substr(4) + "0", seconds) ||
-        minutes >= 60.0 || seconds >= 60.0)
+        minutes >= 60.0 || seconds > 60.0)
         return false;
+    carried = seconds == 60.0;
     const double magnitude = whole + minutes / 60.0 + seconds / 3600.0;
     degrees = negative ? -magnitude : magnitude;
     return true;
@@ -87,9 +89,12 @@ std::optional<Angle> Angle::Read(std::string_view text, AngleIn unit) {
     angle.recorded_ = Normal(text);
     angle.unit_ = unit;
     switch (unit) {
-        case AngleIn::Dms:
-            if (!DmsDegrees(angle.recorded_, angle.degrees_)) return std::nullopt;
+        case AngleIn::Dms: {
+            bool carried = false;
+            if (!DmsDegrees(angle.recorded_, angle.degrees_, carried)) return std::nullopt;
+            if (carried) angle.recorded_.clear();  // written converted, as a proper angle
             break;
+        }
         case AngleIn::Gons:
             angle.degrees_ = value * 0.9;
             break;

@@ -8,7 +8,9 @@
 // Decisions:
 // - ddd.mmss text is read as a decimal number whose first two decimals are minutes and the
 //   next two seconds, the rest fractions of a second ("12.3" is 12 degrees 30 minutes).
-//   Minutes or seconds of 60 or more make the text no angle.
+//   Minutes of 60 or more, or seconds above 60, make the text no angle. Seconds of exactly
+//   60, which some instruments write when they round 59.5 seconds up, carry into the minutes;
+//   such an angle is written converted, never as recorded.
 // - Feet are international feet (0.3048 m) and US survey feet 1200/3937 m.
 
 #include <optional>

@@ -1,14 +1,6 @@
 #include "Rw5Translator.h"
 
-#include <cmath>
-
 #include "Text.h"
-
-namespace {
-
-constexpr double kPi = 3.14159265358979323846;
-
-}  // namespace
 
 Rw5Translator::Rw5Translator(sxn::NeutralWriter& out)
     : out_(out), length_unit_(sxn::SameLength(out.Units().length)) {}
@@ -159,30 +151,19 @@ bool Rw5Translator::Observe(const Rw5Record& record, bool back_sight) {
 
     std::optional<sxn::Length> slope;
     std::optional<sxn::Length> level;
-    if (record.Has("SD") && !(slope = ReadLength(record.Value("SD")))) return false;
-    if (record.Has("HD") && !(level = ReadLength(record.Value("HD")))) return false;
-    double zenith = 90.0;
-    if (record.Has("ZE") || record.Has("VA")) {
-        const auto angle = ReadAngle(record.Value(record.Has("ZE") ? "ZE" : "VA"));
-        if (!angle) return false;
-        observation.zenith =
-            record.Has("ZE") ? *angle : sxn::Angle::FromDegrees(90.0 - angle->Degrees());
-        zenith = observation.zenith.Degrees();
-    } else if (record.Has("CE")) {
-        const auto rise = ReadLength(record.Value("CE"));
-        if (!rise || !(slope || level)) return false;
-        const double across = level ? level->Metres()
-                                    : std::sqrt(std::max(0.0, slope->Metres() * slope->Metres() -
-                                                                  rise->Metres() * rise->Metres()));
-        zenith = std::atan2(across, rise->Metres()) * 180.0 / kPi;
-        observation.zenith = sxn::Angle::FromDegrees(zenith);
-        if (!slope) slope = sxn::Length::FromMetres(std::hypot(across, rise->Metres()));
-    } else {
-        observation.zenith = sxn::Angle::FromDegrees(zenith);
+    std::optional<sxn::Length> rise;
+    std::optional<sxn::Angle> zenith;
+    if ((record.Has("SD") && !(slope = ReadLength(record.Value("SD")))) ||
+        (record.Has("HD") && !(level = ReadLength(record.Value("HD")))) ||
+        (record.Has("CE") && !(rise = ReadLength(record.Value("CE")))) ||
+        (record.Has("ZE") && !(zenith = ReadAngle(record.Value("ZE")))))
+        return false;
+    if (!zenith && record.Has("VA")) {
+        const auto vertical = ReadAngle(record.Value("VA"));
+        if (!vertical) return false;
+        zenith = sxn::Angle::FromDegrees(90.0 - vertical->Degrees());
     }
-    if (!slope && level)
-        slope = sxn::Length::FromMetres(level->Metres() / std::sin(zenith * kPi / 180.0));
-    observation.slope = slope ? *slope : sxn::Length::FromMetres(0.0);
+    sxn::CompleteSight(observation, zenith, slope, level, rise);
     out_.Observe(observation);
     return true;
 }
