@@ -34,13 +34,6 @@ std::optional<sxn::Angle> ReadAngle(std::string_view text) {
     return sxn::Angle::Read(text, sxn::AngleIn::Gons);
 }
 
-// Reads `text` into `value`; false when it is no value of its kind.
-template <class Value, class Reader>
-bool Take(std::optional<Value>& value, std::string_view text, Reader read) {
-    value = read(text);
-    return value.has_value();
-}
-
 }  // namespace
 
 bool AreTranslator::Line(const sxn::RawLine& line) {
@@ -80,9 +73,9 @@ bool AreTranslator::Label(int label, std::string_view value) {
             out_.Prove();
             return !group_->id.empty();
         case kTargetHeight:
-            return Take(target_height_, value, ReadLength);
+            return sxn::ReadInto(target_height_, value, ReadLength);
         case kInstrumentHeight:
-            if (station) return Take(group_->instrument_height, value, ReadLength);
+            if (station) return sxn::ReadInto(group_->instrument_height, value, ReadLength);
             if (const auto height = ReadLength(value)) {
                 out_.InstrumentHeight(*height);
                 return true;
@@ -91,7 +84,7 @@ bool AreTranslator::Label(int label, std::string_view value) {
         case kNorth:
         case kEast:
         case kElevation:
-            if (group_) return Take(*CoordinateOf(label), value, ReadLength);
+            if (group_) return sxn::ReadInto(*CoordinateOf(label), value, ReadLength);
             break;
         case kBackPoint:
             if (station) {
@@ -101,7 +94,7 @@ bool AreTranslator::Label(int label, std::string_view value) {
             }
             break;
         case kBackBearing:
-            if (station) return Take(group_->back_bearing, value, ReadAngle);
+            if (station) return sxn::ReadInto(group_->back_bearing, value, ReadAngle);
             break;
         case kCode:
             if (point) {
@@ -110,19 +103,19 @@ bool AreTranslator::Label(int label, std::string_view value) {
             }
             break;
         case kHorizontal:
-            if (point) return Take(group_->horizontal, value, ReadAngle);
+            if (point) return sxn::ReadInto(group_->horizontal, value, ReadAngle);
             break;
         case kZenith:
-            if (point) return Take(group_->zenith, value, ReadAngle);
+            if (point) return sxn::ReadInto(group_->zenith, value, ReadAngle);
             break;
         case kSlope:
-            if (point) return Take(group_->slope, value, ReadLength);
+            if (point) return sxn::ReadInto(group_->slope, value, ReadLength);
             break;
         case kRise:
-            if (point) return Take(group_->rise, value, ReadLength);
+            if (point) return sxn::ReadInto(group_->rise, value, ReadLength);
             break;
         case kLevel:
-            if (point) return Take(group_->level, value, ReadLength);
+            if (point) return sxn::ReadInto(group_->level, value, ReadLength);
             break;
         default:
             break;

@@ -31,18 +31,17 @@
 #include <optional>
 #include <string>
 
-#include "LineSplitter.h"
-#include "NeutralWriter.h"
+#include "LineSession.h"
 
-class AreTranslator {
+class AreTranslator : public sxn::LineTranslator {
   public:
     static constexpr const char* kTag = "ARE";
     static constexpr const char* kName = "Trimble ARE";
 
-    explicit AreTranslator(sxn::NeutralWriter& out) : out_(out) {}
+    using LineTranslator::LineTranslator;
 
-    bool Line(const sxn::RawLine& line);
-    void Finish() { PutGroup(); }
+    bool Line(const sxn::RawLine& line) override;
+    void Finish() override { PutGroup(); }
 
   private:
     /// False when the value of a label that is read cannot be.
@@ -68,7 +67,6 @@ class AreTranslator {
         std::string unmapped;
     };
 
-    sxn::NeutralWriter& out_;
     std::optional<Group> group_;
     std::optional<sxn::Length> target_height_;
 };

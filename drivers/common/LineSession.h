@@ -3,9 +3,8 @@
 // (LineSplitter), a translator of the format turns each line into records through a
 // NeutralWriter, and the driver's five naming and starting functions come from one macro.
 //
-// A translator is a class with the constants kTag ("RW5") and kName ("Carlson RW5"), a
-// constructor taking the NeutralWriter, `bool Line(const sxn::RawLine&)` (false for a line
-// that could not be read) and `void Finish()`.
+// A translator derives from LineTranslator and has the constants kTag ("RW5") and kName
+// ("Carlson RW5").
 //
 // Decisions:
 // - Blank lines give nothing. A line cut by the splitter for its length is not handed to the
@@ -21,6 +20,23 @@
 #include "NeutralWriter.h"
 
 namespace sxn {
+
+/// Turns the lines of one format into records, through the writer it is given.
+class LineTranslator {
+  public:
+    explicit LineTranslator(NeutralWriter& out) : out_(out) {}
+    virtual ~LineTranslator() = default;
+    LineTranslator(const LineTranslator&) = delete;
+    LineTranslator& operator=(const LineTranslator&) = delete;
+
+    /// One line that is not blank; false when it could not be read.
+    virtual bool Line(const RawLine& line) = 0;
+    /// The data have ended: what is held back goes out.
+    virtual void Finish() {}
+
+  protected:
+    NeutralWriter& out_;
+};
 
 template <class Translator>
 class LineSession : public sxn_session {

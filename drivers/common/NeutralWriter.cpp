@@ -1,5 +1,6 @@
 #include "NeutralWriter.h"
 
+#include <algorithm>
 #include <cmath>
 #include <utility>
 
@@ -94,14 +95,17 @@ void NeutralWriter::Out(const std::string& text) {
 }
 
 void NeutralWriter::Comment(std::string_view text) {
-    Record("# " + CommentText(text));
+    std::string comment = CommentText(text);
+    comment.erase(comment.find_last_not_of(' ') + 1);
+    Record("# " + comment.substr(std::min(comment.size(), comment.find_first_not_of(' '))));
 }
 
 void NeutralWriter::Unread(long line, std::string_view bytes) {
     if (refused_) return;
     ++unread_;
-    Record("# " + tag_ + " LINE " + std::to_string(line) +
-           " NOT READ: " + Printable(CommentText(bytes), kShown));
+    std::string text = CommentText(bytes);
+    text.erase(text.find_last_not_of(' ') + 1);
+    Record("# " + tag_ + " LINE " + std::to_string(line) + " NOT READ: " + Printable(text, kShown));
 }
 
 std::string NeutralWriter::LengthText(const std::optional<Length>& length) const {

@@ -69,4 +69,11 @@ class Length {
     LengthIn unit_ = LengthIn::Metres;
 };
 
+/// Reads `source` with `read` into `value`; false when the reader gave nothing.
+template <class Value, class Source, class Reader>
+bool ReadInto(std::optional<Value>& value, const Source& source, Reader read) {
+    value = read(source);
+    return value.has_value();
+}
+
 }  // namespace sxn

@@ -32,18 +32,17 @@
 #include <optional>
 #include <string>
 
-#include "LineSplitter.h"
-#include "NeutralWriter.h"
+#include "LineSession.h"
 
-class GtsTranslator {
+class GtsTranslator : public sxn::LineTranslator {
   public:
     static constexpr const char* kTag = "GTS";
     static constexpr const char* kName = "Topcon GTS";
 
-    explicit GtsTranslator(sxn::NeutralWriter& out) : out_(out) {}
+    using LineTranslator::LineTranslator;
 
-    bool Line(const sxn::RawLine& line);
-    void Finish();
+    bool Line(const sxn::RawLine& line) override;
+    void Finish() override;
 
   private:
     /// The record gathered so far is complete; false when it could not be read.
@@ -63,7 +62,6 @@ class GtsTranslator {
         std::optional<sxn::Length> height;
     };
 
-    sxn::NeutralWriter& out_;
     std::string record_;
     long record_line_ = 0;
     bool in_record_ = false;

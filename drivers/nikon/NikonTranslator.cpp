@@ -59,7 +59,7 @@ bool NikonTranslator::Record(const Fields& fields, std::string_view line) {
         read = Shot(fields, 3, Name(At(fields, 1), At(fields, 2)), false, Rest(line, 8));
         comment = type == "SO";
     } else if (type == "UP" || type == "MP" || type == "RE" || type == "CC") {
-        read = Coordinates(fields, type != "CC");
+        read = Coordinates(fields, type != "CC", Rest(line, 6));
         comment = type != "CC";
     } else {
         comment = true;
@@ -136,7 +136,7 @@ bool NikonTranslator::Shot(const Fields& fields, std::size_t first, const std::s
     return true;
 }
 
-bool NikonTranslator::Coordinates(const Fields& fields, bool given) {
+bool NikonTranslator::Coordinates(const Fields& fields, bool given, std::string_view code) {
     const std::string id = Name(At(fields, 1), At(fields, 2));
     sxn::Coordinates at;
     const std::pair<std::size_t, std::optional<sxn::Length>*> values[] = {
@@ -150,7 +150,7 @@ bool NikonTranslator::Coordinates(const Fields& fields, bool given) {
     if (given) {
         out_.Xyz(id, at);
     } else {
-        out_.Point(id, at, sxn::FieldText(At(fields, 6)));
+        out_.Point(id, at, sxn::FieldText(code));
     }
     return true;
 }

@@ -38,18 +38,16 @@
 #include <string_view>
 #include <vector>
 
-#include "LineSplitter.h"
-#include "NeutralWriter.h"
+#include "LineSession.h"
 
-class NikonTranslator {
+class NikonTranslator : public sxn::LineTranslator {
   public:
     static constexpr const char* kTag = "NIKON";
     static constexpr const char* kName = "Nikon RAW v2.00";
 
-    explicit NikonTranslator(sxn::NeutralWriter& out) : out_(out) {}
+    using LineTranslator::LineTranslator;
 
-    bool Line(const sxn::RawLine& line);
-    void Finish() {}
+    bool Line(const sxn::RawLine& line) override;
 
   private:
     using Fields = std::vector<std::string_view>;
@@ -60,9 +58,8 @@ class NikonTranslator {
     /// A shot whose fields run from `first`: ht, sd, ha, va.
     bool Shot(const Fields& fields, std::size_t first, const std::string& id, bool back_sight,
               std::string_view code);
-    bool Coordinates(const Fields& fields, bool given);
+    bool Coordinates(const Fields& fields, bool given, std::string_view code);
 
-    sxn::NeutralWriter& out_;
     sxn::LengthIn length_unit_ = sxn::LengthIn::Metres;
     sxn::AngleIn angle_unit_ = sxn::AngleIn::Dms;
     bool from_horizon_ = false;

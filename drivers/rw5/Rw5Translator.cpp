@@ -3,7 +3,7 @@
 #include "Text.h"
 
 Rw5Translator::Rw5Translator(sxn::NeutralWriter& out)
-    : out_(out), length_unit_(sxn::SameLength(out.Units().length)) {}
+    : LineTranslator(out), length_unit_(sxn::SameLength(out.Units().length)) {}
 
 bool Rw5Translator::Line(const sxn::RawLine& line) {
     const std::string text = sxn::CommentText(line.bytes);

@@ -41,19 +41,18 @@
 #include <optional>
 #include <string>
 
-#include "LineSplitter.h"
-#include "NeutralWriter.h"
+#include "LineSession.h"
 #include "Rw5Record.h"
 
-class Rw5Translator {
+class Rw5Translator : public sxn::LineTranslator {
   public:
     static constexpr const char* kTag = "RW5";
     static constexpr const char* kName = "Carlson RW5";
 
     explicit Rw5Translator(sxn::NeutralWriter& out);
 
-    bool Line(const sxn::RawLine& line);
-    void Finish();
+    bool Line(const sxn::RawLine& line) override;
+    void Finish() override;
 
   private:
     /// False when the record is of a known type but could not be read.
@@ -78,7 +77,6 @@ class Rw5Translator {
         bool has_coordinates = false;
     };
 
-    sxn::NeutralWriter& out_;
     sxn::LengthIn length_unit_;
     sxn::AngleIn angle_unit_ = sxn::AngleIn::Dms;
     bool south_azimuths_ = false;

@@ -32,18 +32,16 @@
 #include <string>
 #include <string_view>
 
-#include "LineSplitter.h"
-#include "NeutralWriter.h"
+#include "LineSession.h"
 
-class SdrTranslator {
+class SdrTranslator : public sxn::LineTranslator {
   public:
     static constexpr const char* kTag = "SDR";
     static constexpr const char* kName = "Sokkia SDR33";
 
-    explicit SdrTranslator(sxn::NeutralWriter& out) : out_(out) {}
+    using LineTranslator::LineTranslator;
 
-    bool Line(const sxn::RawLine& line);
-    void Finish() {}
+    bool Line(const sxn::RawLine& line) override;
 
   private:
     /// Reads the fields of a record from column 5 on: names `name_width` wide, numbers
@@ -59,7 +57,6 @@ class SdrTranslator {
     /// A back sight or observation of another station than the set-up begins a set-up of it.
     void SetUp(const std::string& station);
 
-    sxn::NeutralWriter& out_;
     std::size_t name_width_ = 16;
     std::size_t number_width_ = 16;
     sxn::LengthIn length_unit_ = sxn::LengthIn::Metres;

@@ -33,18 +33,16 @@
 #include <string_view>
 #include <vector>
 
-#include "LineSplitter.h"
-#include "NeutralWriter.h"
+#include "LineSession.h"
 
-class Tps1200Translator {
+class Tps1200Translator : public sxn::LineTranslator {
   public:
     static constexpr const char* kTag = "TPS1200";
     static constexpr const char* kName = "Leica TPS 1200 export";
 
-    explicit Tps1200Translator(sxn::NeutralWriter& out) : out_(out) {}
+    using LineTranslator::LineTranslator;
 
-    bool Line(const sxn::RawLine& line);
-    void Finish() {}
+    bool Line(const sxn::RawLine& line) override;
 
   private:
     enum class Section { None, Job, Points, Lines, Station, Measurements };
@@ -56,7 +54,6 @@ class Tps1200Translator {
     bool StationRow(const Words& words);
     bool MeasurementRow(const Words& words);
 
-    sxn::NeutralWriter& out_;
     Section section_ = Section::None;
     bool head_seen_ = false;  // the head line of the section has gone by
     std::string line_id_;

@@ -28,18 +28,17 @@
 #include <optional>
 #include <string>
 
-#include "LineSplitter.h"
-#include "NeutralWriter.h"
+#include "LineSession.h"
 
-class Tps700Translator {
+class Tps700Translator : public sxn::LineTranslator {
   public:
     static constexpr const char* kTag = "TPS700";
     static constexpr const char* kName = "Leica TPS 700 export";
 
-    explicit Tps700Translator(sxn::NeutralWriter& out) : out_(out) {}
+    using LineTranslator::LineTranslator;
 
-    bool Line(const sxn::RawLine& line);
-    void Finish();
+    bool Line(const sxn::RawLine& line) override;
+    void Finish() override;
 
   private:
     /// False when the line is none of the head, set-up or point lines.
@@ -47,7 +46,6 @@ class Tps700Translator {
     bool PointLine(std::string_view line);
     void PutSetUp();
 
-    sxn::NeutralWriter& out_;
     std::string setup_;
     std::optional<sxn::Length> instrument_height_;
     long without_coordinates_ = 0;

@@ -31,12 +31,6 @@ std::optional<sxn::Angle> ReadAngle(const ZeissBlock& block) {
     return std::nullopt;
 }
 
-template <class Value, class Reader>
-bool Take(std::optional<Value>& value, const ZeissBlock& block, Reader read) {
-    value = read(block);
-    return value.has_value();
-}
-
 }  // namespace
 
 bool ZeissTranslator::Line(const sxn::RawLine& line) {
@@ -67,34 +61,34 @@ bool ZeissTranslator::Read(const ZeissLine& line, Values& values, bool& mapped) 
         const std::string& id = block.identifier;
         bool read = true;
         if (id == "X") {
-            read = Take(values.at.north, block, ReadLength);
+            read = sxn::ReadInto(values.at.north, block, ReadLength);
         } else if (id == "Y") {
-            read = Take(values.at.east, block, ReadLength);
+            read = sxn::ReadInto(values.at.east, block, ReadLength);
         } else if (id == "Z") {
-            read = Take(values.at.height, block, ReadLength);
+            read = sxn::ReadInto(values.at.height, block, ReadLength);
         } else if (id == "Hz") {
-            read = Take(values.horizontal, block, ReadAngle);
+            read = sxn::ReadInto(values.horizontal, block, ReadAngle);
         } else if (id == "V1") {
-            read = Take(values.zenith, block, ReadAngle);
+            read = sxn::ReadInto(values.zenith, block, ReadAngle);
         } else if (id == "V2") {
-            read = Take(values.zenith, block, ReadAngle);
+            read = sxn::ReadInto(values.zenith, block, ReadAngle);
             if (read) values.zenith = sxn::Angle::FromDegrees(90.0 - values.zenith->Degrees());
         } else if (id == "SD") {
-            read = Take(values.slope, block, ReadLength);
+            read = sxn::ReadInto(values.slope, block, ReadLength);
         } else if (id == "HD") {
-            read = Take(values.level, block, ReadLength);
+            read = sxn::ReadInto(values.level, block, ReadLength);
         } else if (id == "h") {
-            read = Take(values.rise, block, ReadLength);
+            read = sxn::ReadInto(values.rise, block, ReadLength);
         } else if (id == "th") {
-            read = Take(values.target_height, block, ReadLength);
+            read = sxn::ReadInto(values.target_height, block, ReadLength);
         } else if (id == "ih") {
-            read = Take(values.instrument_height, block, ReadLength);
+            read = sxn::ReadInto(values.instrument_height, block, ReadLength);
         } else if (id == "m") {
             double scale = 0.0;
             read = sxn::ReadNumber(block.value, scale);
             values.scale = block.value;
         } else if (id == "Om") {
-            read = Take(values.orientation, block, ReadAngle);
+            read = sxn::ReadInto(values.orientation, block, ReadAngle);
         } else {
             mapped = false;
         }

@@ -26,19 +26,18 @@
 #include <optional>
 #include <string>
 
-#include "LineSplitter.h"
-#include "NeutralWriter.h"
+#include "LineSession.h"
 #include "ZeissLine.h"
 
-class ZeissTranslator {
+class ZeissTranslator : public sxn::LineTranslator {
   public:
     static constexpr const char* kTag = "ZEISS";
     static constexpr const char* kName = "Zeiss R4/R5/Rec 500";
 
-    explicit ZeissTranslator(sxn::NeutralWriter& out) : out_(out) {}
+    using LineTranslator::LineTranslator;
 
-    bool Line(const sxn::RawLine& line);
-    void Finish() { PutSetUp(); }
+    bool Line(const sxn::RawLine& line) override;
+    void Finish() override { PutSetUp(); }
 
   private:
     struct Values;
@@ -48,7 +47,6 @@ class ZeissTranslator {
     bool Point(const ZeissLine& line, const Values& values);
     void PutSetUp();
 
-    sxn::NeutralWriter& out_;
     std::string pending_scale_;
     std::optional<sxn::Angle> pending_orientation_;
     bool station_open_ = false;  // a station has been written and nothing observed from it
