@@ -11,6 +11,8 @@ namespace {
 constexpr const char* kHeader = "#VERSION-1.0 NEUTRAL FILE";
 constexpr double kNoValue = -10000.0;
 constexpr std::size_t kShown = 200;
+// The lines not read that the message names; the comments name them all.
+constexpr long kLinesNamed = 10;
 constexpr double kDegrees = 180.0 / 3.14159265358979323846;
 
 std::string Field(const char* key, const std::string& value) {
@@ -102,7 +104,8 @@ void NeutralWriter::Comment(std::string_view text) {
 
 void NeutralWriter::Unread(long line, std::string_view bytes) {
     if (refused_) return;
-    ++unread_;
+    if (++unread_ <= kLinesNamed)
+        unread_lines_ += (unread_ == 1 ? "" : ", ") + std::to_string(line);
     std::string text = CommentText(bytes);
     text.erase(text.find_last_not_of(' ') + 1);
     Record("# " + tag_ + " LINE " + std::to_string(line) + " NOT READ: " + Printable(text, kShown));
@@ -170,6 +173,7 @@ void NeutralWriter::NotFormat() {
     refused_ = true;
     held_.clear();
     unread_ = 0;
+    unread_lines_.clear();
     message_("The data are not " + name_ + ": no " + tag_ + " record was found in them.");
 }
 
@@ -182,7 +186,9 @@ void NeutralWriter::Finish() {
     }
     if (unread_ > 0) {
         message_(std::to_string(unread_) + (unread_ == 1 ? " line" : " lines") + " of the " + tag_ +
-                 " data could not be read; they stand as comments that name their lines.");
+                 " data could not be read (" + (unread_ == 1 ? "line " : "lines ") + unread_lines_ +
+                 (unread_ > kLinesNamed ? ", ..." : "") +
+                 "); they stand as comments that name their lines.");
     }
 }
 

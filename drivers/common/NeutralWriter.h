@@ -9,7 +9,7 @@
 //   first) give no records at all, only the message "The data are not <format>: ...".
 // - Observations before any station cannot be reduced: the user is told so at the end.
 // - A line that cannot be read becomes the comment "# <TAG> LINE n NOT READ: <text>" and is
-//   counted; the count goes to the user at the end.
+//   counted; at the end the user is told the count and the numbers of the first ten.
 // - A coordinate without a value (no height) is written as -10000, which means none; an
 //   empty field of a neutral record would take the value of the record before it.
 // - Names and codes may not hold the characters that separate neutral fields: commas and '='
@@ -118,6 +118,7 @@ class NeutralWriter {
     bool station_seen_ = false;
     bool observed_before_station_ = false;
     long unread_ = 0;
+    std::string unread_lines_;  // the numbers of the first lines not read
 };
 
 }  // namespace sxn

@@ -46,7 +46,7 @@ bool ZeissLine::ReadBarred(std::string_view line, std::size_t first_block) {
         name_ = std::string(sxn::Trim(info.substr(3)));
     } else {
         code_ = std::string(sxn::Trim(info.substr(3, 3)));
-        name_ = std::string(sxn::Trim(info.substr(6)));
+        if (info.size() > 6) name_ = std::string(sxn::Trim(info.substr(6)));
     }
     for (std::size_t i = first_block + 1; i < fields.size(); ++i) {
         const std::vector<std::string_view> words = Words(fields[i]);

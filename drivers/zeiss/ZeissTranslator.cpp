@@ -43,7 +43,13 @@ bool ZeissTranslator::Line(const sxn::RawLine& line) {
     ZeissLine zeiss;
     Values values;
     bool mapped = true;
-    if (!zeiss.Read(text) || !Read(zeiss, values, mapped) ||
+    // Values of no point (a point line without a number) other than the set-up's own.
+    const auto pointless = [&] {
+        return !zeiss.IsText() && zeiss.Name().empty() &&
+               (values.at.north || values.at.east || values.at.height || values.horizontal ||
+                values.slope || values.level);
+    };
+    if (!zeiss.Read(text) || !Read(zeiss, values, mapped) || pointless() ||
         (!zeiss.IsText() && !zeiss.Name().empty() && !Point(zeiss, values))) {
         out_.Unread(line.number, line.bytes);
         return false;

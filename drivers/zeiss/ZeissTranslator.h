@@ -21,7 +21,8 @@
 // Decisions where the formats leave the reader alone:
 // - Values without a unit (Rec 500) are metres and gons. Units "m", "ft", "grd" and "gon",
 //   and "deg" (decimal degrees) are read; any other makes the line one not read.
-// - A line of none of the three layouts, or whose values cannot be read, is a line not read.
+// - A line of none of the three layouts, whose values cannot be read, or that gives
+//   coordinates or readings without a point number, is a line not read.
 
 #include <optional>
 #include <string>

@@ -54,8 +54,8 @@ TEST(AreDriver, ASightFromDistancesAndLabelsThatCannotBeRead) {
     EXPECT_EQ(result.records, expected);
     ASSERT_EQ(result.messages.size(), 2u);
     EXPECT_EQ(result.messages[1],
-              "2 lines of the ARE data could not be read; they stand as comments that name their "
-              "lines.");
+              "2 lines of the ARE data could not be read (lines 8, 9); they stand as comments "
+              "that name their lines.");
 }
 
 }  // namespace

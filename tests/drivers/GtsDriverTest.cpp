@@ -46,8 +46,8 @@ TEST(GtsDriver, UnframedRecordsCodesFeetAndRecordsNotRead) {
                               "# GTS POINT P2 WITHOUT MEASUREMENT"};
     EXPECT_EQ(result.records, expected);
     EXPECT_EQ(result.messages,
-              Records{"1 line of the GTS data could not be read; they stand as comments that name "
-                      "their lines."});
+              Records{"1 line of the GTS data could not be read (line 1); they stand as comments "
+                      "that name their lines."});
 }
 
 TEST(GtsDriver, TextOfAnotherFormatIsRefused) {

@@ -94,8 +94,8 @@ TEST(NikonDriver, EveryRecordTypeFeetAndVerticalAnglesFromTheHorizon) {
                               "# NIKON LINE 12 NOT READ: SS"};
     EXPECT_EQ(result.records, expected);
     EXPECT_EQ(result.messages,
-              Records{"2 lines of the NIKON data could not be read; they stand as comments that "
-                      "name their lines."});
+              Records{"2 lines of the NIKON data could not be read (lines 11, 12); they stand as "
+                      "comments that name their lines."});
 }
 
 }  // namespace

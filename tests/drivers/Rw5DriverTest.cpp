@@ -108,8 +108,19 @@ TEST(Rw5Driver, LinesThatCannotBeReadAreNamed) {
     EXPECT_EQ(records[7], "# RW5 LINE 5 NOT READ: SS,OP1,FP9,AR1.7500,ZE90.0000,SD5.000");
     EXPECT_EQ(records[8], "# RW5 LINE 6 NOT READ: OC,OP2,N north,E 2.0");
     EXPECT_EQ(result.messages,
-              Records{"5 lines of the RW5 data could not be read; they stand as comments that "
-                      "name their lines."});
+              Records{"5 lines of the RW5 data could not be read (lines 2, 3, 4, 5, 6); they "
+                      "stand as comments that name their lines."});
+}
+
+TEST(Rw5Driver, TheMessageNamesTheFirstTenLinesNotRead) {
+    DriverRun rw5(kDriver);
+    std::string data = "OC,OP1\n";
+    for (int i = 0; i < 12; ++i) data += "?\n";
+    const auto result = rw5.Import(data, SXN_MODE_DMS | SXN_MODE_METRES);
+    EXPECT_EQ(CountOf(result.records, "# RW5 LINE "), 12);
+    EXPECT_EQ(result.messages,
+              Records{"12 lines of the RW5 data could not be read (lines 2, 3, 4, 5, 6, 7, 8, 9, "
+                      "10, 11, ...); they stand as comments that name their lines."});
 }
 
 TEST(Rw5Driver, DataOfAnotherFormatAndRecordsSplitAcrossReads) {

@@ -92,17 +92,20 @@ TEST(ZeissDriver, PolarReadingsUnitsAndIdentifiersOfEveryLayout) {
     // A horizontal distance of 3 and a height difference of 4: zenith atan(3/4) = 40.966553 gon.
     const std::string distances = "   0004 " + std::string(17, ' ') + "15" + std::string(9, ' ') +
                                   "Hz      50.0000 HD       3.000 h        4.000";
-    const auto result = zeiss.Import(
-        polar + "\n" + strange_unit + "\n" + strange_value + "\n" + distances + "\n", kGonsMetres);
+    const std::string nameless = "For R4|KR A|X        1.000 m   |";
+    const auto result = zeiss.Import(polar + "\n" + strange_unit + "\n" + strange_value + "\n" +
+                                         distances + "\n" + nameless + "\n",
+                                     kGonsMetres);
     const Records expected = {"#VERSION-1.0 NEUTRAL FILE",
                               "UNIT UL=M,UA=G",
                               "SS ID=12,HA=100.0000,VA=100.0000,SD=10.000,CO=ABC",
                               "# ZEISS LINE 2 NOT READ: " + strange_unit,
                               "PT ID=14,E=2.000,N=1.000,H=-10000.000,CO=",
                               "# " + strange_value,
-                              "SS ID=15,HA=50.0000,VA=40.966553,SD=5.0000,CO=,HD=3.000,VD=4.000"};
+                              "SS ID=15,HA=50.0000,VA=40.966553,SD=5.0000,CO=,HD=3.000,VD=4.000",
+                              "# ZEISS LINE 5 NOT READ: " + nameless};
     EXPECT_EQ(result.records, expected);
-    EXPECT_EQ(result.messages.size(), 2u);  // no station, and the line not read
+    EXPECT_EQ(result.messages.size(), 2u);  // no station, and the lines not read
 }
 
 }  // namespace
