@@ -62,10 +62,11 @@ bool NikonTranslator::Record(const Fields& fields, std::string_view line) {
         read = Coordinates(fields, type != "CC", Rest(line, 6));
         comment = type != "CC";
     } else {
-        comment = true;
+        out_.Comment(line);  // a record of the format that has no neutral counterpart
+        return true;
     }
     if (!read) return false;
-    if (type == "CO" || type == "ST" || type == "SS") out_.Prove();
+    out_.Prove();
     if (comment) out_.Comment(line);
     return true;
 }

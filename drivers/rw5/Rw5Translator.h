@@ -16,18 +16,19 @@
 //   (above 180 degrees on face 2), so the records keep it as read. The horizontal reading
 //   comes from AR (angle right), AL (angle left, 360 - AL), DR and DL (deflection, 180 + DR,
 //   180 - DL) or AZ (azimuth, turned into a circle reading by the back azimuth and back
-//   circle of the set-up); the zenith from ZE, VA (vertical angle, 90 - VA) or, with the
-//   horizontal distance HD, the height difference CE. The slope distance is SD, else worked
-//   out from HD; an angle-only shot has 0. The note is the code.
+//   circle of the set-up); the zenith from ZE, VA (vertical angle, 90 - VA) or the height
+//   difference CE with the horizontal or slope distance. The slope distance is SD, else
+//   worked out from HD; an angle-only shot has 0. The note is the code.
 // - SP (stored point): XYZ, so that a control point can orient and position stations.
 // - MO (mode): the units of what follows (UN 0 feet, 1 metres, 2 US feet; AU 0 degrees as
 //   ddd.mmss, 1 gons; AD 1 azimuths from South) and SCALE with its scale factor SF.
 // - JB (job): JOB and DATE.
 // Notes ("--" lines, such as the collector's own computations) and records that have no
 // neutral counterpart (GPS records and the like) stand as comments; so do MO, JB and SP
-// records as a whole, for what their mapped fields leave out. A record whose values cannot be
-// read, a record of no known type, or an observation without a horizontal reading is a line
-// not read.
+// records with a note, whole, for what their mapped fields leave out. A record whose values
+// cannot be read, a line that is no record (no type of two or three capitals before its first
+// comma), and an observation without a horizontal reading (an AZ at a set-up without a back
+// azimuth among them) are lines not read.
 //
 // Decisions where the format leaves the reader alone:
 // - An MO record that stands as a note ("--MO,..."), as some collectors write the head of a
