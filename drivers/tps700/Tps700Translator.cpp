@@ -77,7 +77,7 @@ void Tps700Translator::PutSetUp() {
 
 bool Tps700Translator::PointLine(std::string_view line) {
     const std::vector<std::string_view> fields = sxn::Split(line, ',');
-    if (fields.size() < 4) return false;
+    if (fields.size() < 4 || fields.size() > 5) return false;
     const std::string id = sxn::FieldText(fields[0]);
     sxn::Coordinates at;
     at.east = sxn::Length::Read(fields[1], sxn::LengthIn::Metres);

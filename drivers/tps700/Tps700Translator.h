@@ -23,7 +23,8 @@
 //   put at 1, 1 and no real coordinates of the same point are overwritten. The user is told
 //   how many there were.
 // - The dashes after a code fill its column: they are not part of the code.
-// - A point line whose coordinates cannot be read is a line not read.
+// - A line of commas that is not the point, three coordinates and at most a code, or whose
+//   coordinates cannot be read, is a line not read.
 
 #include <optional>
 #include <string>

@@ -56,6 +56,11 @@ TEST(LeicaExportDriver, Tps700PointLinesThatCannotBeRead) {
                               "# TPS700 LINE 3 NOT READ:   200,  abc,   1.0,   2.0, X ----",
                               "STN ID=7,HI=1.550,CO=", "PT ID=201,E=5.0,N=6.0,H=7.0,CO="};
     EXPECT_EQ(result.records, expected);
+    // Comma-separated records of another format are no point lines.
+    const auto nikon = tps.Import(RawFixture("nikon_raw_v200.tops"), kDmsMetres);
+    EXPECT_TRUE(nikon.records.empty());
+    EXPECT_EQ(nikon.messages, Records{"The data are not Leica TPS 700 export: no TPS700 record was "
+                                      "found in them."});
 }
 
 TEST(LeicaExportDriver, TheSystem1200ExportAsRecorded) {
