@@ -30,9 +30,10 @@ class RawDownload : public InstrumentDocFixture {
     }
     int Download() { return doc.Download(nedit::FromUtf8(raw), &list); }
 
-    FakeInstrument instrument;
     std::string raw = dir.File("OUTTEMP.$$$");
     std::string rilievo;
+    // Last, so that its thread, which reads the members above, is joined before they go.
+    FakeInstrument instrument;
 };
 
 TEST_F(RawDownload, ABlockAtATimeThenTheTimeOutEndsIt) {
