@@ -67,7 +67,8 @@ int UNeditDoc::Load(UListCtrl* list) {
     bool first = true;
     while (stream.ReadString(line)) {
         if (stream.GetLength() > 0) {
-            Progress.Update(static_cast<int>(100 * stream.GetPosition() / stream.GetLength()), L"");
+            Progress->Update(static_cast<int>(100 * stream.GetPosition() / stream.GetLength()),
+                             L"");
         }
         if (line.empty()) {
             int rest = 0;
@@ -193,14 +194,14 @@ int UNeditDoc::SetupDataBase(const std::wstring& path) {
 }
 
 void UNeditDoc::StartEngine(UListCtrl* list) {
-    Database = std::make_unique<UNeditDatabase>(this, list, SurveyDoc, Host, &Progress, L"*CHK");
+    Database = std::make_unique<UNeditDatabase>(this, list, SurveyDoc, Host, Progress, L"*CHK");
     Database->SetReportPtr(NReport.get());
     Database->SetFileName(NeuFileName);  // the bearing store lies beside the neutral file
 }
 
 int UNeditDoc::RunEngine(UListCtrl* list) {
     if (!Database->Process()) {
-        Progress.Update(100, L"");
+        Progress->Update(100, L"");
         return 0;
     }
     // Coordinates the run was given go into the rows, and so into the document.
@@ -209,7 +210,7 @@ int UNeditDoc::RunEngine(UListCtrl* list) {
         Database->ClearAddPtList();
     }
     Database->CreateContent();
-    Progress.Update(100, L"");
+    Progress->Update(100, L"");
     return 1;
 }
 
@@ -269,9 +270,9 @@ void UNeditDoc::TakeJobUnits() {
 
 void UNeditDoc::SetAbortProcess(bool abort) {
     if (abort) {
-        Progress.RequestAbort();
+        Progress->RequestAbort();
     } else {
-        Progress.ClearAbort();
+        Progress->ClearAbort();
     }
 }
 

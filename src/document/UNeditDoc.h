@@ -103,8 +103,11 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat {
     /// The host of the document's messages, and of its list's.
     void SetDialogHost(nedit::DialogHost* host);
     nedit::DialogHost* GetDialogHost() const { return Host; }
-    nedit::ProgressSink& GetProgress() { return Progress; }
-    bool GetAbortProcess() const { return Progress.AbortRequested(); }
+    nedit::ProgressSink& GetProgress() { return *Progress; }
+    /// Progress and the abort flag go to `sink` from now on (the desktop's progress bar);
+    /// null gives the document its own silent sink back. The sink must outlive its use.
+    void SetProgressSink(nedit::ProgressSink* sink) { Progress = sink ? sink : &OwnProgress; }
+    bool GetAbortProcess() const { return Progress->AbortRequested(); }
     void SetAbortProcess(bool abort);
     bool GetAbortProcessOn() const { return AbortProcessOn; }
     void SetAbortProcessOn(bool on) { AbortProcessOn = on; }
@@ -136,7 +139,8 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat {
     USurveyDoc* SurveyDoc;
     UDocument* ParentDoc;
     nedit::DialogHost* Host = nullptr;
-    nedit::ProgressSink Progress;
+    nedit::ProgressSink OwnProgress;
+    nedit::ProgressSink* Progress = &OwnProgress;
     std::wstring NeuText;
     std::wstring NeuFileName;
     std::unique_ptr<UListCtrl> List;
