@@ -95,12 +95,23 @@ CNeditViewPane::CNeditViewPane(UNeditDoc* doc, QtDialogHost* host, QtProgressSin
 }
 
 CNeditViewPane::~CNeditViewPane() {
+    Detach();
+}
+
+void CNeditViewPane::Detach() {
+    // The window hears nothing more of a pane that is going.
+    blockSignals(true);
     if (FindDlg) FindDlg->close();
+    if (ReportView) ReportView->close();
     if (ListCtrl != nullptr) {
         ListCtrl->SetEvents(nullptr);
         ListCtrl->SetRecordForm(nullptr);
         ListCtrl->SetGraphicView(nullptr);
         ListCtrl->SetClipboard(nullptr);
+        ListCtrl = nullptr;
+        ListView->SetList(nullptr);
+        DlgView->SetList(nullptr);
+        Recorder->SetList(nullptr);
     }
     Document->SetProgressSink(nullptr);
 }

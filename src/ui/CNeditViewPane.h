@@ -116,6 +116,9 @@ class CNeditViewPane : public QWidget {
     void PrintList(QPrinter& printer) const;
     /// Offers to save unsaved changes; false when the user cancels the close.
     bool CanClosePane();
+    /// Lets go of the document and its list, before the pane is deleted: the document may
+    /// have a new pane before this one is gone.
+    void Detach();
 
     /// Sizes the splitters as the stored state says, once the pane has its size; a maximised
     /// window keeps the list's width as it is.

@@ -54,14 +54,15 @@ std::wstring RecentKey(int index) {
 
 }  // namespace
 
-UNeditMainWindow::UNeditMainWindow(QWidget* parent)
+UNeditMainWindow::UNeditMainWindow(std::unique_ptr<QtDialogHost> host, QWidget* parent)
     : QMainWindow(parent),
-      host_(std::make_unique<QtDialogHost>(this)),
+      host_(host ? std::move(host) : std::make_unique<QtDialogHost>()),
       actions_(new CommandActions(this)),
       central_(new QStackedWidget(this)),
       start_(new StartPage(central_)),
       tabs_(new QTabWidget(central_)) {
     setObjectName(QStringLiteral("SXNeditWindow"));
+    host_->SetParent(this);
     setAcceptDrops(true);
     actions_->BuildMenus(this);
     actions_->BuildToolbars(this);
@@ -279,7 +280,9 @@ bool UNeditMainWindow::ClosePane(CNeditViewPane* pane) {
     if (pane == nullptr || !pane->CanClosePane()) return false;
     SavePlacement(pane);
     tabs_->removeTab(tabs_->indexOf(pane));
-    delete pane;
+    // The pane may be in the middle of its own command (Close): it goes when that is done.
+    pane->Detach();
+    pane->deleteLater();
     RefreshDocuments();
     ShowCentral();
     UpdateTitle();
@@ -378,8 +381,9 @@ CNeditViewPane* UNeditMainWindow::CurrentPane() const {
 
 QList<CNeditViewPane*> UNeditMainWindow::Panes() const {
     QList<CNeditViewPane*> panes;
-    for (int i = 0; i < tabs_->count(); ++i)
-        panes << qobject_cast<CNeditViewPane*>(tabs_->widget(i));
+    for (int i = 0; i < tabs_->count(); ++i) {
+        if (auto* pane = qobject_cast<CNeditViewPane*>(tabs_->widget(i))) panes << pane;
+    }
     return panes;
 }
 
@@ -525,7 +529,12 @@ void UNeditMainWindow::dragEnterEvent(QDragEnterEvent* event) {
 }
 
 void UNeditMainWindow::dropEvent(QDropEvent* event) {
-    for (const QUrl& url : event->mimeData()->urls()) {
+    OpenDropped(event->mimeData()->urls());
+    event->acceptProposedAction();
+}
+
+void UNeditMainWindow::OpenDropped(const QList<QUrl>& urls) {
+    for (const QUrl& url : urls) {
         if (!url.isLocalFile()) continue;
         const QString path = url.toLocalFile();
         if (QFileInfo(path).suffix().compare(QStringLiteral("job"), Qt::CaseInsensitive) == 0) {
@@ -534,7 +543,6 @@ void UNeditMainWindow::dropEvent(QDropEvent* event) {
             OpenFile(path);
         }
     }
-    event->acceptProposedAction();
 }
 
 }  // namespace nedit

@@ -13,11 +13,13 @@
 
 #include <QMainWindow>
 #include <QStringList>
+#include <QUrl>
 #include <memory>
 #include <string>
 
 #include "ui/CNeditViewPane.h"
 #include "ui/JobSession.h"
+#include "ui/QtDialogHost.h"
 
 class QLabel;
 class QListWidget;
@@ -27,7 +29,6 @@ class QTabWidget;
 namespace nedit {
 
 class CommandActions;
-class QtDialogHost;
 class QtProgressSink;
 class StartPage;
 
@@ -36,7 +37,10 @@ class UNeditMainWindow : public QMainWindow {
   public:
     static constexpr int kRecentLimit = 8;
 
-    explicit UNeditMainWindow(QWidget* parent = nullptr);
+    /// A window whose messages and dialogs go to `host` (a QtDialogHost on the window when
+    /// none is given).
+    explicit UNeditMainWindow(std::unique_ptr<QtDialogHost> host = nullptr,
+                              QWidget* parent = nullptr);
     ~UNeditMainWindow() override;
 
     /// Opens what the command line names: a job file, or a neutral file as a document of
@@ -44,6 +48,8 @@ class UNeditMainWindow : public QMainWindow {
     bool OpenPath(const QString& path);
     bool OpenJob(const QString& path);
     bool NewJob(const QString& path);
+    /// Files dropped on the window: a job is opened, a neutral file becomes a document.
+    void OpenDropped(const QList<QUrl>& urls);
     /// The pane of the document of that name, opened (loaded and reduced) when it is not.
     CNeditViewPane* OpenDocument(const std::wstring& name);
 

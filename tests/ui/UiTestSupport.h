@@ -11,9 +11,17 @@
 #include <vector>
 
 #include "ui/QtDialogHost.h"
+#include "ui/UNeditMainWindow.h"
+
+class UListCtrl;
 
 class QDialog;
 class QMessageBox;
+
+namespace nedit {
+class CNeditViewPane;
+class UNeditGraphView;
+}  // namespace nedit
 
 namespace nedit::test {
 
@@ -54,6 +62,37 @@ class ScriptedHost : public QtDialogHost {
     std::map<QString, FormScript> scripts_;
     std::vector<QString> messages_;
     std::vector<QString> forms_;
+};
+
+/// A window on a copy of the bundled example, opened as a neutral file (so as a document
+/// of the job beside the copy), with a scripted host and a private configuration.
+class ExampleWindow {
+  public:
+    /// `prepare` runs before the example is opened, to script the host.
+    explicit ExampleWindow(const std::function<void(ScriptedHost&)>& prepare = {});
+    ~ExampleWindow();
+
+    UNeditMainWindow& Window() { return *window_; }
+    ScriptedHost& Host() { return *host_; }
+    CNeditViewPane& Pane();
+    UListCtrl& List();
+    UNeditGraphView& Plan();
+    /// The copy of the example, and the job beside it.
+    QString Neutral() const { return work_.filePath(QStringLiteral("boundary.neu")); }
+    QString Job() const { return work_.filePath(QStringLiteral("boundary.job")); }
+    QString WorkFile(const QString& name) const { return work_.filePath(name); }
+    /// The row texts of the list.
+    QStringList Rows();
+    /// Where a world point is on the plan widget.
+    QPoint OnPlan(double east, double north);
+    /// The middle of a row of the list's viewport.
+    QPoint OnRow(int row);
+
+  private:
+    ConfigDirectory config_;
+    QTemporaryDir work_;
+    ScriptedHost* host_;
+    std::unique_ptr<UNeditMainWindow> window_;
 };
 
 }  // namespace nedit::test
