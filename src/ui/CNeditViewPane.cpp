@@ -62,6 +62,8 @@ CNeditViewPane::CNeditViewPane(UNeditDoc* doc, QtDialogHost* host, QtProgressSin
       Clipboard(std::make_unique<QtClipboard>()) {
     setObjectName(QStringLiteral("NeditViewPane"));
     BuildLayout();
+    // A document opened in a window has its report (a renamed copy may not have one yet).
+    if (Document->GetNReport() == nullptr) Document->CreateNReport();
     Document->SetDialogHost(Host);
     Document->SetProgressSink(Progress);
     GraphView->SetDoc(Document);
@@ -326,14 +328,16 @@ int CNeditViewPane::SetSelected(const PlanPick& pick) {
             name = database->GetArcList()[index].GetEndPt();
             break;
     }
-    if (const std::size_t rect = name.find(L"RECT-"); rect != std::wstring::npos) {
-        name = name.substr(rect + 5);
-    } else if (name.find(L"CENTER") != std::wstring::npos) {
-        name = name.substr(name.find(L'-') + 1);
-    }
-    const int row = SearchList(name);
+    const int row = SearchList(RecordNameOf(name));
     if (row >= 0) SetSelectList(row);
     return 0;
+}
+
+std::wstring CNeditViewPane::RecordNameOf(const std::wstring& name) {
+    if (const std::size_t rect = name.find(L"RECT-"); rect != std::wstring::npos)
+        return name.substr(rect + 5);
+    if (name.find(L"CENTER") != std::wstring::npos) return name.substr(name.find(L'-') + 1);
+    return name;
 }
 
 // ---- Splitters -----------------------------------------------------------------------------

@@ -100,9 +100,12 @@ class CNeditViewPane : public QWidget {
     int SearchList(const std::wstring& name) const;
     /// Only `row` selected and focused, in view, shown in the form; the list takes the focus.
     void SetSelectList(int row);
-    /// The row of a picked object becomes the selection (its point's name, without "RECT-"
-    /// before it, or what follows the first '-' of a "CENTER" name). Always 0.
+    /// The row of a picked object becomes the selection: the row of its point's name (a
+    /// line's end point, an arc's end point) as RecordNameOf gives it. Always 0.
     int SetSelected(const PlanPick& pick);
+    /// The name a derived point's record goes by: what follows "RECT-" in a rectangle's
+    /// corner, what follows the first '-' of a "CENTER" name, else the name itself.
+    static std::wstring RecordNameOf(const std::wstring& name);
     /// With the job's coordinate order 1, the E, N and H parts of a template change places so
     /// that northing comes first; with order 0 the text is given back as it is.
     static std::wstring CheckCoordinateOrder(const std::wstring& record, int order);

@@ -45,7 +45,6 @@ FindRecordDialog::FindRecordDialog(QWidget* parent)
     buttons->addStretch();
     layout->addLayout(buttons, 0, 3, 2, 1);
     connect(find, &QPushButton::clicked, this, &FindRecordDialog::FindNext);
-    connect(text_, &QLineEdit::returnPressed, this, &FindRecordDialog::FindNext);
     connect(cancel, &QPushButton::clicked, this, &FindRecordDialog::close);
 }
 

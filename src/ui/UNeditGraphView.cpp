@@ -399,6 +399,8 @@ void UNeditGraphView::mouseDoubleClickEvent(QMouseEvent* event) {
         frozen_ || (doc_ != nullptr && doc_->GetAbortProcessOn())) {
         return;
     }
+    // The first click of the two has picked; without it the double click picks itself.
+    if (selected_.kind == PlanPick::Kind::None) PickAt(event->position().toPoint());
     if (selected_.kind != PlanPick::Kind::None) emit objectInfoRequested(selected_);
 }
 
