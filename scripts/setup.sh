@@ -7,7 +7,7 @@ BUILD_DIR="${SXNEDIT_BUILD_DIR:-$ROOT/build}"
 
 # Debian packages the build and the tests need.
 PACKAGES=(g++ cmake ninja-build pkg-config libgtest-dev libgmock-dev libbenchmark-dev
-          libsqlite3-dev)
+          libsqlite3-dev qt6-base-dev xvfb xauth)
 
 install_missing_packages() {
     local missing=()

@@ -344,6 +344,10 @@ std::wstring CNeditViewPane::RecordNameOf(const std::wstring& name) {
 
 void CNeditViewPane::setInitialPaneSizes(const ProfileStore& profile, bool maximised) {
     StoredColumn = profile.ReadColumnSize(maximised);
+    // A maximised window takes the list's own stored width instead.
+    const long list_width = profile.ReadListWidth();
+    if (!StoredColumn && list_width > 0)
+        StoredColumn = SplitterColumn{static_cast<int>(list_width), ListView->minimumWidth()};
     SizesPending = true;
     if (height() > 0 && isVisible()) ApplyPaneSizes();
 }
@@ -362,6 +366,10 @@ void CNeditViewPane::ApplyPaneSizes() {
     if (!StoredColumn) return;
     ListView->setMinimumWidth(StoredColumn->minimum);
     Columns->setSizes({StoredColumn->width, std::max(Columns->width() - StoredColumn->width, 1)});
+}
+
+void CNeditViewPane::SaveListWidth(const ProfileStore& profile) const {
+    profile.WriteListWidth(ListView->width());
 }
 
 void CNeditViewPane::GetSplitterState(WindowState& state) const {

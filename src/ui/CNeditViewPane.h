@@ -126,6 +126,8 @@ class CNeditViewPane : public QWidget {
     /// Sizes the splitters as the stored state says, once the pane has its size; a maximised
     /// window keeps the list's width as it is.
     void setInitialPaneSizes(const ProfileStore& profile, bool maximised);
+    /// Stores the width of the record list, which a maximised window takes again.
+    void SaveListWidth(const ProfileStore& profile) const;
     /// The splitter values of the window state: row 0 height and minimum, column 0 width and
     /// minimum.
     void GetSplitterState(WindowState& state) const;

@@ -35,6 +35,9 @@ StartPage::StartPage(QWidget* parent)
     column->addWidget(recent_label_);
     column->addWidget(recent_);
     recent_->setMaximumHeight(180);
+    recent_->setMinimumWidth(460);
+    recent_->setTextElideMode(Qt::ElideMiddle);
+    recent_->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     auto* outer = new QHBoxLayout(this);
     outer->addStretch();
     outer->addLayout(column);

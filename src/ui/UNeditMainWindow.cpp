@@ -94,6 +94,7 @@ UNeditMainWindow::UNeditMainWindow(std::unique_ptr<QtDialogHost> host, QWidget* 
     resize(1280, 800);
     RestorePlacement();
     RefreshRecent();
+    RefreshDocuments();
     ShowCentral();
     UpdateTitle();
     UpdateActions();
@@ -129,6 +130,7 @@ void UNeditMainWindow::BuildStatusBar() {
 
 void UNeditMainWindow::BuildDocumentList() {
     auto* dock = new QDockWidget(QStringLiteral("Raw Data"), this);
+    documents_dock_ = dock;
     dock->setObjectName(QStringLiteral("RawDataDock"));
     dock->setFeatures(QDockWidget::DockWidgetMovable | QDockWidget::DockWidgetClosable);
     documents_ = new QListWidget(dock);
@@ -136,9 +138,9 @@ void UNeditMainWindow::BuildDocumentList() {
     documents_->setToolTip(
         QStringLiteral("The raw-data documents of the job; double click to open"));
     dock->setWidget(documents_);
-    dock->setMinimumWidth(130);
+    dock->setMinimumWidth(110);
     addDockWidget(Qt::LeftDockWidgetArea, dock);
-    resizeDocks({dock}, {150}, Qt::Horizontal);
+    resizeDocks({dock}, {120}, Qt::Horizontal);
     connect(documents_, &QListWidget::itemActivated, this,
             [this](QListWidgetItem* item) { OpenDocument(item->text().toStdWString()); });
 }
@@ -199,9 +201,17 @@ bool UNeditMainWindow::OpenPath(const QString& path) {
         return false;
     }
     if (!JobSession::IsNeutralFile(path.toStdString())) return OpenJob(path);
-    const QString job = QString::fromStdString(JobSession::JobBeside(path.toStdString()));
-    if (!(QFileInfo::exists(job) ? OpenJob(job) : NewJob(job))) return false;
-    beside_ = file.fileName();
+    QString job = QString::fromStdString(JobSession::JobBeside(path.toStdString()));
+    if (!QFileInfo::exists(job) && !QFileInfo(QFileInfo(job).absolutePath()).isWritable()) {
+        // No job can be made beside the file: the user says where it goes.
+        job = choose_file_(true, tr("New Job for %1").arg(file.fileName()),
+                           QString::fromLatin1(kJobFilter), QFileInfo(job).fileName());
+        if (job.isEmpty()) return false;
+    }
+    const bool made = !QFileInfo::exists(job);
+    if (!(made ? NewJob(job) : OpenJob(job))) return false;
+    beside_ = (made ? QStringLiteral("new job beside ") : QStringLiteral("job beside ")) +
+              file.fileName();
     OpenFile(path);
     return true;
 }
@@ -404,6 +414,8 @@ void UNeditMainWindow::ShowCentral() {
 
 void UNeditMainWindow::RefreshDocuments() {
     documents_->clear();
+    // Without a job there are no documents to list.
+    documents_dock_->setVisible(session_.IsOpen());
     if (!session_.IsOpen()) return;
     for (const std::wstring& name : session_.Container()->GetDocumentNames()) {
         auto* item = new QListWidgetItem(QString::fromStdWString(name), documents_);
@@ -421,7 +433,7 @@ void UNeditMainWindow::UpdateTitle() {
     if (session_.IsOpen()) {
         title +=
             QStringLiteral(" - ") + QFileInfo(QString::fromStdString(session_.Path())).fileName();
-        if (!beside_.isEmpty()) title += QStringLiteral(" (new job beside %1)").arg(beside_);
+        if (!beside_.isEmpty()) title += QStringLiteral(" (%1)").arg(beside_);
     }
     if (CNeditViewPane* pane = CurrentPane()) title += QStringLiteral(" - ") + pane->Title();
     setWindowTitle(title);
@@ -491,10 +503,12 @@ void UNeditMainWindow::SavePlacement(const CNeditViewPane* pane) const {
     state.top = normal.top();
     state.right = normal.right();
     state.bottom = normal.bottom();
+    ProfileStore profile;
     if (pane != nullptr) {
         pane->GetSplitterState(state);
+        pane->SaveListWidth(profile);
     } else {
-        const std::vector<int> values = ParseWindowState(ProfileStore().ReadWindowStateText());
+        const std::vector<int> values = ParseWindowState(profile.ReadWindowStateText());
         if (values.size() >= 10) {
             state.rowHeight = values[6];
             state.rowMinimum = values[7];
@@ -502,7 +516,7 @@ void UNeditMainWindow::SavePlacement(const CNeditViewPane* pane) const {
             state.columnMinimum = values[9];
         }
     }
-    ProfileStore().WriteWindowState(state);
+    profile.WriteWindowState(state);
     const QRect frame = centralWidget()->geometry();
     WriteFramePos(frame.left(), frame.top(), frame.right(), frame.bottom());
 }

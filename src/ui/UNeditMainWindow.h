@@ -21,6 +21,7 @@
 #include "ui/JobSession.h"
 #include "ui/QtDialogHost.h"
 
+class QDockWidget;
 class QLabel;
 class QListWidget;
 class QStackedWidget;
@@ -103,9 +104,10 @@ class UNeditMainWindow : public QMainWindow {
     StartPage* start_;
     QTabWidget* tabs_;
     QListWidget* documents_ = nullptr;
+    QDockWidget* documents_dock_ = nullptr;
     QLabel* coordinates_ = nullptr;
     QLabel* scale_ = nullptr;
-    QString beside_;  // the neutral file the job was made beside, for the title
+    QString beside_;  // the title's word on the neutral file the job stands beside
     CNeditViewPane::FileChooser choose_file_;
 };
 

@@ -44,6 +44,7 @@ class DesktopWindowTest : public QObject {
     void openingANeutralFileMakesAJobBesideIt();
     void reopeningTheFileShowsTheStoredDocument();
     void theFirstReductionAsksForTheStationAndDrawsThePlan();
+    void withoutAJobOnlyTheJobCommandsAreEnabled();
     void commandsAreEnabledByTheirRules();
     void whileAReductionRunsOnlyAbortIsEnabled();
     void abortStopsTheReduction();
@@ -94,6 +95,19 @@ void DesktopWindowTest::theFirstReductionAsksForTheStationAndDrawsThePlan() {
     const UWRect seen = example.Plan().Transform().VisibleWorld();
     QVERIFY(seen.Contains(*b));
     QVERIFY(seen.Contains(UWPoint(996.540, 2104.666)));  // D
+}
+
+void DesktopWindowTest::withoutAJobOnlyTheJobCommandsAreEnabled() {
+    nedit::test::ConfigDirectory config;
+    UNeditMainWindow window(std::make_unique<ScriptedHost>());
+    window.show();
+    QVERIFY(window.Actions().Action(cmd::NewJob)->isEnabled());
+    QVERIFY(window.Actions().Action(cmd::OpenJob)->isEnabled());
+    for (const int id : {cmd::FileNew, cmd::FileOpen, cmd::ZoomAll, cmd::EditCopy, cmd::InsPt,
+                         cmd::Regenerate, cmd::SaveDocument}) {
+        QVERIFY2(!window.Actions().Action(id)->isEnabled(), qPrintable(QString::number(id)));
+    }
+    QVERIFY(!window.DocumentList()->isVisible());
 }
 
 void DesktopWindowTest::commandsAreEnabledByTheirRules() {
@@ -197,6 +211,7 @@ void DesktopWindowTest::splittersAreSizedAsTheStoredStateSays() {
     const std::vector<int> stored = ParseWindowState(ProfileStore().ReadWindowStateText());
     QCOMPARE(stored.size(), std::size_t{10});
     QCOMPARE(stored[8], 500);
+    QCOMPARE(ProfileStore().ReadListWidth(), 500L);
     QCOMPARE(ColumnFromWindowState({0, 1, 2, 3, 4, 5, 6, 7, 8}).width, 32);
 }
 
