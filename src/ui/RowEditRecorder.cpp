@@ -65,30 +65,25 @@ std::wstring RowEditRecorder::Text(int row) const {
     return list_->GetItemText(row);
 }
 
-void RowEditRecorder::RowsAboutToBeRemoved(int first, int count) {
+void RowEditRecorder::RecordRows(RowEdit::Kind kind, int first, int count) {
     if (list_ == nullptr) return;
     if (paused_) {
         emit rowsChanged();
         return;
     }
-    RowEdit edit{RowEdit::Kind::Remove, first, {}};
+    RowEdit edit{kind, first, {}};
     edit.texts.reserve(static_cast<std::size_t>(count));
     for (int row = first; row < first + count; ++row) edit.texts.push_back(Text(row));
     pending_.push_back(std::move(edit));
     Recorded();
 }
 
+void RowEditRecorder::RowsAboutToBeRemoved(int first, int count) {
+    RecordRows(RowEdit::Kind::Remove, first, count);
+}
+
 void RowEditRecorder::RowsInserted(int first, int count) {
-    if (list_ == nullptr) return;
-    if (paused_) {
-        emit rowsChanged();
-        return;
-    }
-    RowEdit edit{RowEdit::Kind::Insert, first, {}};
-    edit.texts.reserve(static_cast<std::size_t>(count));
-    for (int row = first; row < first + count; ++row) edit.texts.push_back(Text(row));
-    pending_.push_back(std::move(edit));
-    Recorded();
+    RecordRows(RowEdit::Kind::Insert, first, count);
 }
 
 void RowEditRecorder::RowAboutToChange(int row) {

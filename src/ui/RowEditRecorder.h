@@ -53,6 +53,8 @@ class RowEditRecorder : public QObject, public ListEvents {
     void rowShown(int row);
 
   private:
+    /// Rows from `first` on, read as they stand now: before a removal, after an insert.
+    void RecordRows(RowEdit::Kind kind, int first, int count);
     void Recorded();
     std::wstring Text(int row) const;
 

@@ -161,37 +161,32 @@ bool UNeditMainWindow::CloseJob() {
 }
 
 bool UNeditMainWindow::OpenJob(const QString& path) {
-    if (!CloseJob()) return false;
-    std::wstring error;
-    if (!session_.Open(path.toStdString(), error)) {
-        ShowError(error);
-        RefreshDocuments();
-        ShowCentral();
-        return false;
-    }
-    AddRecent(QFileInfo(path).absoluteFilePath());
-    RefreshDocuments();
-    const std::vector<std::wstring> names = session_.Container()->GetDocumentNames();
-    if (!names.empty()) OpenDocument(names.front());
-    ShowCentral();
-    UpdateTitle();
-    UpdateActions();
-    return true;
+    return StartJob(path, false);
 }
 
 bool UNeditMainWindow::NewJob(const QString& path) {
+    return StartJob(path, true);
+}
+
+bool UNeditMainWindow::StartJob(const QString& path, bool create) {
     if (!CloseJob()) return false;
     std::wstring error;
-    if (!session_.Create(path.toStdString(), error)) {
+    const std::string file = path.toStdString();
+    const bool started = create ? session_.Create(file, error) : session_.Open(file, error);
+    if (started) {
+        AddRecent(QFileInfo(path).absoluteFilePath());
+    } else {
         ShowError(error);
-        return false;
     }
-    AddRecent(QFileInfo(path).absoluteFilePath());
     RefreshDocuments();
+    if (started) {
+        const std::vector<std::wstring> names = session_.Container()->GetDocumentNames();
+        if (!names.empty()) OpenDocument(names.front());
+    }
     ShowCentral();
     UpdateTitle();
     UpdateActions();
-    return true;
+    return started;
 }
 
 bool UNeditMainWindow::OpenPath(const QString& path) {

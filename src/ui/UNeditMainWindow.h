@@ -88,6 +88,8 @@ class UNeditMainWindow : public QMainWindow {
     void ShowCentral();
     bool ClosePane(CNeditViewPane* pane);
     bool CloseJob();
+    /// Opens (or with `create` makes) a job and its first document.
+    bool StartJob(const QString& path, bool create);
     void OpenFile(const QString& path);
     void ShowCoordinates(double east, double north);
     void RestorePlacement();

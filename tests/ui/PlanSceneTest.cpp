@@ -29,6 +29,13 @@ struct Stores {
     unsigned Point(const wchar_t* name, double x, double y) {
         return engine.SavePoint(name, x, y, 0.0, L"", 0, 0, 0);
     }
+    /// A half circle of radius 10 about (50, 50), from (40, 50) over the top to (60, 50).
+    void HalfCircle() {
+        const UNeditPt start(L"S", 40.0, 50.0, 0.0, L"", 0);
+        const UNeditPt end(L"E", 60.0, 50.0, 0.0, L"", 0);
+        const UNeditPt top(L"T", 50.0, 60.0, 0.0, L"", 0);
+        engine.SaveArc(start, end, top, UWArc::kThirdOnArc);
+    }
 };
 
 }  // namespace
@@ -198,11 +205,7 @@ void PlanSceneTest::pickTriesNoArcWhileALineCounts() {
     const unsigned a = stores.Point(L"A", 0.0, 0.0);
     const unsigned b = stores.Point(L"B", 100.0, 0.0);
     stores.engine.SaveLine(a, b, 0);
-    // A half circle of radius 10 about (50, 50), from (40, 50) over the top to (60, 50).
-    const UNeditPt start(L"S", 40.0, 50.0, 0.0, L"", 0);
-    const UNeditPt end(L"E", 60.0, 50.0, 0.0, L"", 0);
-    const UNeditPt top(L"T", 50.0, 60.0, 0.0, L"", 0);
-    stores.engine.SaveArc(start, end, top, UWArc::kThirdOnArc);
+    stores.HalfCircle();
     PlanScene scene;
     scene.Build(&stores.engine);
     // The click is on the arc, but far from the line's ends it still counts for the line,
@@ -213,10 +216,7 @@ void PlanSceneTest::pickTriesNoArcWhileALineCounts() {
 void PlanSceneTest::pickTakesAnArcOnlyInsideItsSector() {
     Stores stores;
     stores.Point(L"Far", 1000.0, 1000.0);
-    const UNeditPt start(L"S", 40.0, 50.0, 0.0, L"", 0);
-    const UNeditPt end(L"E", 60.0, 50.0, 0.0, L"", 0);
-    const UNeditPt top(L"T", 50.0, 60.0, 0.0, L"", 0);
-    stores.engine.SaveArc(start, end, top, UWArc::kThirdOnArc);
+    stores.HalfCircle();
     PlanScene scene;
     scene.Build(&stores.engine);
     PlanPick pick = scene.Pick(UWPoint(50.0, 60.3), 1.0);
