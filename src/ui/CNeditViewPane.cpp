@@ -101,6 +101,9 @@ CNeditViewPane::~CNeditViewPane() {
 }
 
 void CNeditViewPane::Detach() {
+    // The document may be gone by the time the pane is deleted: it is let go of once.
+    if (Detached) return;
+    Detached = true;
     // The window hears nothing more of a pane that is going.
     blockSignals(true);
     if (FindDlg) FindDlg->close();
@@ -115,6 +118,7 @@ void CNeditViewPane::Detach() {
         DlgView->SetList(nullptr);
         Recorder->SetList(nullptr);
     }
+    GraphView->SetDoc(nullptr);
     Document->SetProgressSink(nullptr);
 }
 

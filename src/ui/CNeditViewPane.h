@@ -181,6 +181,7 @@ class CNeditViewPane : public QWidget {
     QtProgressSink* Progress;
     int ListModified = 0;
     bool Busy = false;
+    bool Detached = false;
     /// The stored column of setInitialPaneSizes, until the pane has a size to apply it to.
     std::optional<SplitterColumn> StoredColumn;
     bool SizesPending = false;
