@@ -16,6 +16,7 @@
 #include "UiTestSupport.h"
 #include "document/UListCtrl.h"
 #include "document/UNeditDoc.h"
+#include "document/URawDataContainer.h"
 #include "reduction/UNeditDatabase.h"
 #include "report/UNeditReport.h"
 #include "ui/CNeditViewPane.h"
@@ -76,6 +77,8 @@ class DesktopPaneTest : public QObject {
     void regenerateAsksAboutTheReportAndShowsIt();
     void findSelectsTheNextMatchingRow();
     void exportWritesEveryRowAndImportReplacesThem();
+    void saveAsKeepsWhatWasSavedUnderTheOldName();
+    void draggingRowsMovesThemAndUndoBringsThemBack();
     void printingMakesPagesOfTheRows();
     void thePlanDrawsPointsAndLinesWhereTheyLie();
     void zoomCommandsWalkTheHistory();
@@ -324,6 +327,58 @@ void DesktopPaneTest::exportWritesEveryRowAndImportReplacesThem() {
     QCOMPARE(example.Pane().GetUndoStack()->count(), 0);
     // The plan draws the new run.
     QVERIFY(example.Plan().Scene().Database() == example.Pane().GetDocument()->GetDatabase());
+}
+
+void DesktopPaneTest::saveAsKeepsWhatWasSavedUnderTheOldName() {
+    ExampleWindow example;
+    QVERIFY(example.Window().RunCommand(cmd::SaveDocument));
+    example.List().SetSelection({kRowP1});
+    example.Window().RunCommand(cmd::CommentRecord);
+    example.Host().SetFormScript(QStringLiteral("Save Raw Data As"), [](QDialog& form) {
+        form.findChild<QLineEdit*>()->setText(QStringLiteral("lot12-checked"));
+        form.accept();
+        return form.result();
+    });
+    QVERIFY(example.Window().RunCommand(cmd::FileSaveAs));
+    // The window goes on under the new name, with the comment; the old name holds the rows
+    // as they were saved.
+    QCOMPARE(example.Pane().GetDocument()->GetName(), std::wstring(L"lot12-checked"));
+    QVERIFY(!example.Window().windowTitle().endsWith(QStringLiteral("*")));
+    UNeditMainWindow again(std::make_unique<nedit::test::ScriptedHost>());
+    QVERIFY(again.OpenJob(example.Job()));
+    UNeditDoc* old = again.Session().Container()->GetNeditDoc(L"boundary");
+    UNeditDoc* renamed = again.Session().Container()->GetNeditDoc(L"lot12-checked");
+    QVERIFY(old != nullptr && renamed != nullptr);
+    QVERIFY(old->OpenList().GetItemText(kRowP1).rfind(L"SS", 0) == 0);
+    QVERIFY(renamed->OpenList().GetItemText(kRowP1).rfind(L"#SS", 0) == 0);
+}
+
+void DesktopPaneTest::draggingRowsMovesThemAndUndoBringsThemBack() {
+    ExampleWindow example;
+    const QStringList original = example.Rows();
+    UNeditView* view = example.Pane().GetNeditView();
+    QWidget* rows = view->viewport();
+    example.List().SetSelection({kRowP1, 12});
+    // Press on the selection, move past the drag distance, release over row 20.
+    const QPoint from = example.OnRow(kRowP1);
+    const QPoint to = example.OnRow(20);
+    QTest::mousePress(rows, Qt::LeftButton, {}, from);
+    QMouseEvent move(QEvent::MouseMove, QPointF(from + QPoint(0, 12)),
+                     rows->mapToGlobal(QPointF(from)), Qt::NoButton, Qt::LeftButton,
+                     Qt::NoModifier);
+    QCoreApplication::sendEvent(rows, &move);
+    QVERIFY(example.List().IsDragging());
+    QMouseEvent over(QEvent::MouseMove, QPointF(to), rows->mapToGlobal(QPointF(to)), Qt::NoButton,
+                     Qt::LeftButton, Qt::NoModifier);
+    QCoreApplication::sendEvent(rows, &over);
+    QTest::mouseRelease(rows, Qt::LeftButton, {}, to);
+    // The two side shots now stand before what was row 20.
+    QCOMPARE(example.List().GetItemCount(), 30);
+    QCOMPARE(example.Rows().mid(18, 2), original.mid(kRowP1, 2));
+    QCOMPARE(example.Rows().at(20), original.at(20));
+    QCOMPARE(example.Pane().GetUndoStack()->undoText(), QStringLiteral("Move Rows"));
+    example.Pane().GetUndoStack()->undo();
+    QCOMPARE(example.Rows(), original);
 }
 
 void DesktopPaneTest::printingMakesPagesOfTheRows() {
