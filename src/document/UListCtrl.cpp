@@ -39,6 +39,7 @@ std::wstring UListCtrl::GetItemText(int row) const {
 
 void UListCtrl::DeleteAllItems() {
     const bool had_selection = GetFirstSelected() >= 0 || focus_ >= 0;
+    if (events_ != nullptr) events_->RowsAboutToBeCleared();
     rows_.clear();
     selected_.clear();
     focus_ = anchor_ = drop_target_ = -1;
@@ -55,14 +56,28 @@ void UListCtrl::Reserve(std::size_t rows) {
     selected_.reserve(rows);
 }
 
+bool UListCtrl::RestoreRows(int row, std::vector<std::wstring> texts) {
+    if (row < 0 || row > GetItemCount()) return false;
+    InsertRows(row, std::move(texts));
+    return true;
+}
+
+bool UListCtrl::RestoreRowText(int row, std::wstring text) {
+    if (!InRange(row)) return false;
+    ReplaceRow(row, std::move(text));
+    return true;
+}
+
 void UListCtrl::InsertRows(int row, std::vector<std::wstring> texts) {
     if (texts.empty()) return;
+    if (events_ != nullptr) events_->RowsAboutToBeInserted(row, static_cast<int>(texts.size()));
     rows_.insert(rows_.begin() + row, std::make_move_iterator(texts.begin()),
                  std::make_move_iterator(texts.end()));
     RowsAdded(row, static_cast<int>(texts.size()));
 }
 
 void UListCtrl::InsertRow(int row, std::wstring text) {
+    if (events_ != nullptr) events_->RowsAboutToBeInserted(row, 1);
     rows_.insert(rows_.begin() + row, std::move(text));
     RowsAdded(row, 1);
 }
@@ -80,6 +95,7 @@ void UListCtrl::RemoveRows(int row, int count) {
     if (row < 0 || count <= 0) return;
     const auto first = selected_.begin() + row;
     const bool lost_selection = std::find(first, first + count, 1) != first + count;
+    if (events_ != nullptr) events_->RowsAboutToBeRemoved(row, count);
     rows_.erase(rows_.begin() + row, rows_.begin() + row + count);
     selected_.erase(first, first + count);
     bool lost_focus = false;
@@ -99,6 +115,7 @@ void UListCtrl::RemoveRows(int row, int count) {
 }
 
 void UListCtrl::ReplaceRow(int row, std::wstring text) {
+    if (events_ != nullptr) events_->RowAboutToChange(row);
     rows_[static_cast<std::size_t>(row)] = std::move(text);
     if (events_ != nullptr) events_->RowChanged(row);
 }

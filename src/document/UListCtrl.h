@@ -109,6 +109,12 @@ class UListCtrl : public nedit::RowSource {
     /// Removes the row; a row that does not exist is left alone.
     void DeleteItem(int row) override;
     void Reserve(std::size_t rows);
+    /// Puts rows back exactly as they were, past the gate, as an undo does: `texts` go in
+    /// before `row` (0 to the row count), unselected. False, with nothing changed, for a row
+    /// out of range.
+    bool RestoreRows(int row, std::vector<std::wstring> texts);
+    /// Gives `row` back the text it had, past the gate. False for a row that does not exist.
+    bool RestoreRowText(int row, std::wstring text);
     /// All rows, in order, for readers that walk the whole list.
     const std::vector<std::wstring>& GetRows() const override { return rows_; }
 

@@ -120,8 +120,8 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     void SetDialogHost(nedit::DialogHost* host);
     nedit::DialogHost* GetDialogHost() const { return Host; }
     nedit::ProgressSink& GetProgress() { return *Progress; }
-    /// Progress and the abort flag go to `sink` from now on (the window's progress bar, the
-    /// terminal); null gives the document its own silent sink back.
+    /// Progress and the abort flag go to `sink` from now on (the desktop's progress bar);
+    /// null gives the document its own silent sink back. The sink must outlive its use.
     void SetProgressSink(nedit::ProgressSink* sink) { Progress = sink ? sink : &OwnProgress; }
     bool GetAbortProcess() const { return Progress->AbortRequested(); }
     void SetAbortProcess(bool abort);
