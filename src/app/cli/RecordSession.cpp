@@ -21,5 +21,8 @@ UNeditDatabase& RecordSession::StartEngine() {
     engine = std::make_unique<UNeditDatabase>(doc.get(), list.get(), doc->GetSurveyDoc(), &host);
     report = std::make_unique<UNeditReport>(doc.get(), L"Raw Data Reduction Report");
     engine->SetReportPtr(report.get());
+    // Every run finds the routes, as the document's own engines do.
+    doc->GetTraverseRoutes().ClearTraverseList();
+    engine->AddStage(&doc->GetTraverseRoutes());
     return *engine;
 }
