@@ -55,10 +55,11 @@ const std::wstring& TraverseRoutes::Value(int id) const {
 std::vector<UNeditStn*> TraverseRoutes::CollectSetUps(const UNeditDatabase& engine,
                                                       const std::vector<std::wstring>& records) {
     std::vector<UNeditStn*> set_ups;
+    RowTypes.resize(records.size());
     for (std::size_t row = 0; row < records.size(); ++row) {
         const std::wstring& text = records[row];
-        if (Format.GetRecordType(text) != rec::Stn || !Format.ProcessRecord(rec::Stn, text, Fields))
-            continue;
+        RowTypes[row] = Format.GetRecordType(text);
+        if (RowTypes[row] != rec::Stn || !Format.ProcessRecord(rec::Stn, text, Fields)) continue;
         const std::wstring name = Value(fld::ID);
         if (name.empty()) continue;
         // A station the run could not position, or a point of a PT record, is no set-up.
@@ -84,12 +85,11 @@ bool TraverseRoutes::FillSetUps(const UNeditDatabase& engine,
                                     ? static_cast<std::size_t>(setUps[s + 1]->GetIndex())
                                     : records.size();
         for (std::size_t row = static_cast<std::size_t>(node.GetIndex()) + 1; row < end; ++row) {
-            const std::wstring& text = records[row];
-            const int type = Format.GetRecordType(text);
+            const int type = RowTypes[row];
             if (type != rec::Bkb && type != rec::Bs && type != rec::Ss && type != rec::Ss2)
                 continue;
-            if (!Format.ProcessRecord(type, text, Fields)) continue;
-            const std::wstring name = Value(fld::ID);
+            if (!Format.ProcessRecord(type, records[row], Fields)) continue;
+            const std::wstring& name = Value(fld::ID);
             if (name.empty()) continue;
             const int at = static_cast<int>(row);
             if (type == rec::Bkb) {

@@ -100,6 +100,7 @@ class TraverseRoutes : public RunStage {
 
     UNeutralFileFormat& Format;
     FieldMap Fields;
+    std::vector<int> RowTypes;  // the type of each row of the search, kept for its memory
     RouteList TraverseList;
     std::vector<std::unique_ptr<NameList>> TraverseBinList;
     // Every set-up of a name, in row order.

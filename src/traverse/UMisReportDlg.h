@@ -1,8 +1,8 @@
 #pragma once
 // "Traverse Misclose Report": how far a traverse misses its fixed end, after each stage, with
 // the buttons that adjust it. The logic is here; a DialogHost shows it. Its fields are the
-// figures the computation fills; a face formats them by the job's settings (coordinates,
-// bearings, distances, angles, areas) and shows the title of the stage reached.
+// figures the computation last filled (MiscloseFigures); a face formats them by the job's settings
+// (coordinates, bearings, distances, angles, areas) and shows the title of the stage reached.
 
 #include <string>
 
@@ -10,7 +10,33 @@
 
 class CTraverse;
 
-class UMisReportDlg : public nedit::UDialogLogic {
+/// How far a traverse misses its fixed end, as the misclose report shows it.
+struct MiscloseFigures {
+    std::wstring FixedID;
+    double FixedE = 0.0;
+    double FixedN = 0.0;
+    double FixedH = 0.0;
+    std::wstring ObservedID;
+    double ObservedE = 0.0;
+    double ObservedN = 0.0;
+    double ObservedH = 0.0;
+    /// Fixed minus observed.
+    double DiffE = 0.0;
+    double DiffN = 0.0;
+    double DiffH = 0.0;
+    /// From the observed to the fixed point, and its horizontal length.
+    double MiscloseBearing = 0.0;
+    double MiscloseDist = 0.0;
+    double AngularError = 0.0;
+    double PerStation = 0.0;
+    double EnclosedArea = 0.0;
+    std::wstring Accuracy;
+    double TraverseLength = 0.0;
+    /// The number of legs.
+    long Setups = 0;
+};
+
+class UMisReportDlg : public nedit::UDialogLogic, public MiscloseFigures {
   public:
     static constexpr int kDialogId = 8041;
     // Controls the logic enables and disables.
@@ -41,29 +67,6 @@ class UMisReportDlg : public nedit::UDialogLogic {
     bool AngularFieldsShown() const { return AngularShown; }
     const CTraverse& GetTraverse() const { return Traverse; }
 
-    // The figures shown, as the computation last filled them.
-    std::wstring FixedID;
-    double FixedE = 0.0;
-    double FixedN = 0.0;
-    double FixedH = 0.0;
-    std::wstring ObservedID;
-    double ObservedE = 0.0;
-    double ObservedN = 0.0;
-    double ObservedH = 0.0;
-    /// Fixed minus observed.
-    double DiffE = 0.0;
-    double DiffN = 0.0;
-    double DiffH = 0.0;
-    /// From the observed to the fixed point, and its horizontal length.
-    double MiscloseBearing = 0.0;
-    double MiscloseDist = 0.0;
-    double AngularError = 0.0;
-    double PerStation = 0.0;
-    double EnclosedArea = 0.0;
-    std::wstring Accuracy;
-    double TraverseLength = 0.0;
-    /// The number of legs.
-    long Setups = 0;
     /// Set when the route dialog asked for an angle check.
     int AngleEnabled = 0;
     int AdjustElevations = 0;

@@ -55,7 +55,7 @@ TEST_F(LoopTraverse, UnadjustedMiscloseOfTheLoop) {
     host.SetFace<UMisReportDlg>([](UMisReportDlg&) { return nedit::mb::IdCancel; });
     TraverseParams params = LoopParams();
     EXPECT_EQ(traverse.Compute(params, nullptr), CTraverse::kGivenUp);
-    const Figures& unadjusted = figures.at(CTraverse::kUnadjusted);
+    const MiscloseFigures& unadjusted = figures.at(CTraverse::kUnadjusted);
     EXPECT_NEAR(unadjusted.DiffE, 0.012765, 2e-6);
     EXPECT_NEAR(unadjusted.DiffN, -0.030275, 2e-6);
     EXPECT_NEAR(unadjusted.DiffH, 0.009782, 2e-6);
@@ -86,7 +86,7 @@ TEST_F(LoopTraverse, CompassRuleThenTheSideShotsAgain) {
     ExpectAt(adjusted, 2, 1150.310992, 1990.712747, 49.787540);
     ExpectAt(adjusted, 3, 1070.100567, 1920.397819, 50.590074);
     ExpectAt(adjusted, 4, 1000.000000, 2000.000000, 50.000000);
-    const Figures& closed = figures.at(CTraverse::kAfterCoordinates);
+    const MiscloseFigures& closed = figures.at(CTraverse::kAfterCoordinates);
     EXPECT_NEAR(closed.MiscloseDist, 0.0, 1e-9);
     EXPECT_EQ(closed.Accuracy, L"");
     EXPECT_NEAR(closed.EnclosedArea, 10556.113905, 1e-3);
@@ -248,4 +248,49 @@ TEST_F(LinkTraverse, OpenTraverseCarriedOnToAnObservedPoint) {
     ExpectAt(adjusted, 4, 1380.0, 2150.0, 51.5);
     // The carried-on point has no set-up and takes its adjusted position as a point.
     ExpectPoint(L"F", 1380.0, 2150.0, 51.5, 2e-6);
+}
+
+class LargeLoop : public TraverseFixture {};
+
+TEST_F(LargeLoop, FiveThousandStationsAreFoundAndAdjusted) {
+    // A regular polygon walked anticlockwise, each set-up turning by the same angle, one leg
+    // measured 5 cm long; a loop that large is found and adjusted without a hang.
+    constexpr int kStations = 5000;
+    const double turn = 180.0 - 360.0 / kStations;
+    std::wstring rows = L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n";
+    for (int i = 0; i < kStations; ++i) {
+        const std::wstring here = L"T" + std::to_wstring(i);
+        const std::wstring back = L"T" + std::to_wstring((i + kStations - 1) % kStations);
+        const std::wstring ahead = L"T" + std::to_wstring((i + 1) % kStations);
+        rows += L"STN ID=" + here + L",HI=1.5\n";
+        if (i == 0) {
+            rows += L"XYZ ID=T0,E=0,N=0,H=0\nBKB ID=" + back + L",BRG=" +
+                    std::to_wstring(270.0 + 360.0 / kStations) + L",HA=0\n";
+        } else {
+            rows += L"BKB ID=" + back + L",HA=0\n";
+        }
+        rows += L"SS ID=" + ahead + L",HA=" + std::to_wstring(turn) + L",VA=90,SD=" +
+                (i == 2500 ? L"10.05" : L"10") + L",HT=1.5\n";
+    }
+    Rows(rows);
+    engine.AddStage(&routes);
+    ASSERT_EQ(engine.Process(), 1);
+    ASSERT_EQ(routes.GetTraverseList().size(), 2u);
+    EXPECT_EQ(routes.GetTraverseList()[1]->size(), kStations + 1u);
+
+    std::wstring names;
+    for (const nedit::NameEntry& entry : *routes.GetTraverseList()[1]) names += entry.Key + L',';
+    CTraverse traverse(&engine);
+    ASSERT_TRUE(traverse.CreateStnList(names));
+    Watch(traverse);
+    PressOnMisclose(false, false);
+    TraverseParams params;
+    params.StartZ = params.FixedZ = 0.0;
+    params.StartBearing = 270.0 + 360.0 / kStations;
+    params.FixedPt = L"T0";
+    ASSERT_EQ(traverse.Compute(params, nullptr), CTraverse::kDone);
+    // The long leg, half way round, points west: the loop ends 5 cm west of its start.
+    EXPECT_NEAR(figures.at(CTraverse::kUnadjusted).MiscloseDist, 0.05, 1e-4);
+    EXPECT_NEAR(figures.at(CTraverse::kAfterCoordinates).MiscloseDist, 0.0, 1e-9);
+    EXPECT_GT(figures.at(CTraverse::kAfterCoordinates).EnclosedArea, 0.0);
 }

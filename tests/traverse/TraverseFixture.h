@@ -28,12 +28,7 @@ class TraverseFixture : public ReductionFixture {
     void Watch(CTraverse& traverse) {
         traverse.SetStageObserver([this, &traverse](int stage) {
             positions[stage] = traverse.GetRoute();
-            figures[stage] =
-                Figures{traverse.GetReport().DiffE,          traverse.GetReport().DiffN,
-                        traverse.GetReport().DiffH,          traverse.GetReport().MiscloseDist,
-                        traverse.GetReport().AngularError,   traverse.GetReport().PerStation,
-                        traverse.GetReport().EnclosedArea,   traverse.GetReport().Accuracy,
-                        traverse.GetReport().TraverseLength, traverse.GetReport().Setups};
+            figures[stage] = traverse.GetReport();
         });
     }
 
@@ -59,15 +54,8 @@ class TraverseFixture : public ReductionFixture {
         return report.GetText().find(text) != std::wstring::npos;
     }
 
-    struct Figures {
-        double DiffE, DiffN, DiffH, MiscloseDist, AngularError, PerStation, EnclosedArea;
-        std::wstring Accuracy;
-        double TraverseLength;
-        long Setups;
-    };
-
     nedit::TraverseRoutes routes{format};
     UNeditReport report{nullptr, L"Raw Data Reduction Report"};
     std::map<int, std::vector<CTravStn>> positions;
-    std::map<int, Figures> figures;
+    std::map<int, MiscloseFigures> figures;
 };

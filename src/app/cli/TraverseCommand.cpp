@@ -13,8 +13,6 @@
 #include "RunFiles.h"
 #include "TraverseOptions.h"
 #include "TraverseRun.h"
-#include "platform/job/JobError.h"
-#include "platform/job/USurveyDoc.h"
 #include "platform/text/WideText.h"
 #include "traverse/CTraverse.h"
 #include "traverse/TraverseRoutes.h"
@@ -28,36 +26,20 @@ struct FileOptions {
     TraverseOptions traverse;
 };
 
-/// The session reduced from the file; an exit status other than Ok when it could not start.
-int Reduce(const FileOptions& options, RecordSession& session, std::unique_ptr<USurveyDoc>& job,
-           bool quiet) {
-    if (!options.job.empty()) {
-        try {
-            job = USurveyDoc::OpenJob(options.job);
-        } catch (const nedit::JobError& error) {
-            std::fprintf(stderr, "sxnedit: %s\n", error.what());
-            return exit_status::Unreadable;
-        }
-    }
-    session.host.SetEcho(!quiet);
-    if (!session.Start(job.get())) return exit_status::Failed;
-    UNeditDatabase& engine = session.StartEngine();
-    if (!engine.LoadNeFile(nedit::FromUtf8(options.file))) {
-        if (quiet) {
-            for (const std::wstring& message : session.host.Messages())
-                std::fprintf(stderr, "sxnedit: %s\n", nedit::ToUtf8(message).c_str());
-        }
-        return exit_status::Unreadable;
-    }
-    return engine.Process() ? exit_status::Ok : exit_status::Failed;
+/// The session reduced from the file: Ok, Failed for a run that did not reach its end, or the
+/// status of a job or file that could not be read.
+int Reduce(const FileOptions& options, RecordSession& session, bool quiet) {
+    const int started = session.Start(options.job, quiet);
+    if (started != exit_status::Ok) return started;
+    if (!session.Load(options.file, quiet)) return exit_status::Unreadable;
+    return session.engine->Process() ? exit_status::Ok : exit_status::Failed;
 }
 
 int Routes(const FileOptions& options) {
     if (!RunFiles().Reads(options.file).Reads(options.job).Check()) return exit_status::Failed;
     RecordSession session;
-    std::unique_ptr<USurveyDoc> job;
-    const int reduced = Reduce(options, session, job, options.json);
-    if (reduced == exit_status::Unreadable || !session.doc) return reduced;
+    const int reduced = Reduce(options, session, options.json);
+    if (reduced == exit_status::Unreadable || !session.engine) return reduced;
     const auto& routes = session.doc->GetTraverseRoutes().GetTraverseList();
     if (options.json) {
         json::Value all = json::Value::array();
@@ -88,9 +70,8 @@ int Adjust(const FileOptions& options) {
     TraverseRequest request;
     if (!ReadRequest(traverse, request)) return exit_status::Unreadable;
     RecordSession session;
-    std::unique_ptr<USurveyDoc> job;
-    const int reduced = Reduce(options, session, job, traverse.json);
-    if (reduced == exit_status::Unreadable || !session.doc) return reduced;
+    const int reduced = Reduce(options, session, traverse.json);
+    if (reduced == exit_status::Unreadable || !session.engine) return reduced;
     UNeditDatabase& engine = *session.engine;
     const TraverseOutcome outcome =
         RunTraverse(engine, session.doc->GetTraverseRoutes(), session.host, request);

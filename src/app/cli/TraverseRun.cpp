@@ -66,6 +66,10 @@ bool ChooseRoute(USelRouteDlg& dialog, const std::vector<std::wstring>& names,
 /// Acts on the route dialog as a user would on the values of `request`, in the dialog's
 /// order; false when the route cannot be chosen.
 bool ApplyRequest(USelRouteDlg& dialog, const TraverseRequest& request, ConsoleDialogHost& host) {
+    if (request.route.size() == 1) {
+        Tell(host, nedit::Translate(L"Invalid or empty traverse route !"));
+        return false;
+    }
     if (!request.route.empty() && !ChooseRoute(dialog, request.route, host)) return false;
     const std::optional<std::wstring> start =
         request.Start
@@ -176,7 +180,13 @@ void TellValuesUsed(const USelRouteDlg& dialog, const TraverseRequest& request,
                           dialog.Start, Coordinates(dialog.StartX, dialog.StartY, dialog.StartZ),
                           Coordinates(e, n, h), dialog.Start));
     }
-    if (!request.FixedX && !names.empty() && SameName(dialog.FixedPt, names.back())) {
+    std::wstring code;
+    if (!request.FixedX && !engine.findCoord(dialog.FixedPt, e, n, h, code, 1, false)) {
+        Tell(host,
+             Format(L"The fixed point %s has no coordinates in the reduced data, so the "
+                    L"dialog's %s are used. Give FixedX, FixedY (--fixed-coords).",
+                    dialog.FixedPt, Coordinates(dialog.FixedX, dialog.FixedY, dialog.FixedZ)));
+    } else if (!request.FixedX && !names.empty() && SameName(dialog.FixedPt, names.back())) {
         Tell(host, Format(L"The fixed point %s is where the reduction left it, as observed along "
                           L"the route, so the traverse closes on itself and its misclose reads 0. "
                           L"Give FixedX, FixedY (--fixed-coords) to close on known coordinates.",
@@ -192,18 +202,7 @@ TraverseStage StageOf(const CTraverse& traverse) {
     TraverseStage stage;
     for (const CTravStn& entry : traverse.GetRoute())
         stage.points.push_back(RowOf(entry.Name, entry.X, entry.Y, entry.Z, L""));
-    const UMisReportDlg& report = traverse.GetReport();
-    stage.DiffE = report.DiffE;
-    stage.DiffN = report.DiffN;
-    if (report.FixedH > kNoHeight && report.ObservedH > kNoHeight) stage.DiffH = report.DiffH;
-    stage.MiscloseBearing = report.MiscloseBearing;
-    stage.MiscloseDist = report.MiscloseDist;
-    stage.AngularError = report.AngularError;
-    stage.PerStation = report.PerStation;
-    stage.EnclosedArea = report.EnclosedArea;
-    stage.Accuracy = report.Accuracy;
-    stage.TraverseLength = report.TraverseLength;
-    stage.Setups = report.Setups;
+    stage.misclose = traverse.GetReport();
     return stage;
 }
 
@@ -233,18 +232,20 @@ json::Value Number(double value) {
 }
 
 std::string StageJson(const TraverseStage& stage, const char* rule) {
+    const MiscloseFigures& figures = stage.misclose;
+    const bool heights = figures.FixedH > kNoHeight && figures.ObservedH > kNoHeight;
     json::Value misclose = {
-        {"DiffE", Number(stage.DiffE)},
-        {"DiffN", Number(stage.DiffN)},
-        {"DiffH", stage.DiffH ? Number(*stage.DiffH) : json::Value()},
-        {"MiscloseBearing", Number(stage.MiscloseBearing)},
-        {"MiscloseDist", Number(stage.MiscloseDist)},
-        {"AngularError", Number(stage.AngularError)},
-        {"PerStation", Number(stage.PerStation)},
-        {"EnclosedArea", Number(stage.EnclosedArea)},
-        {"Accuracy", json::Text(stage.Accuracy)},
-        {"TraverseLength", Number(stage.TraverseLength)},
-        {"Setups", stage.Setups},
+        {"DiffE", Number(figures.DiffE)},
+        {"DiffN", Number(figures.DiffN)},
+        {"DiffH", heights ? Number(figures.DiffH) : json::Value()},
+        {"MiscloseBearing", Number(figures.MiscloseBearing)},
+        {"MiscloseDist", Number(figures.MiscloseDist)},
+        {"AngularError", Number(figures.AngularError)},
+        {"PerStation", Number(figures.PerStation)},
+        {"EnclosedArea", Number(figures.EnclosedArea)},
+        {"Accuracy", json::Text(figures.Accuracy)},
+        {"TraverseLength", Number(figures.TraverseLength)},
+        {"Setups", figures.Setups},
     };
     std::string out = "{\n    ";
     if (rule != nullptr) out += "\"rule\": \"" + std::string(rule) + "\",\n    ";
@@ -252,15 +253,21 @@ std::string StageJson(const TraverseStage& stage, const char* rule) {
            ",\n    \"misclose\": " + json::Inline(misclose) + "\n  }";
 }
 
+/// A figure to three decimals, without a minus on a value that shows as zero.
+std::wstring Shown(double value) {
+    return Format(L"%.3f", std::fabs(value) < 0.0005 ? 0.0 : value);
+}
+
 std::string MiscloseLine(const char* title, const TraverseStage& stage) {
-    std::wstring line = Format(
-        L"%s: misclose E %.3f, N %.3f, H %s; %.3f at %.6f; length %.3f, "
-        L"%ld legs",
-        nedit::FromUtf8(title), stage.DiffE, stage.DiffN,
-        stage.DiffH ? Format(L"%.3f", *stage.DiffH) : L"none", stage.MiscloseDist,
-        stage.MiscloseBearing, stage.TraverseLength, stage.Setups);
-    if (!stage.Accuracy.empty()) line += L", accuracy " + stage.Accuracy;
-    if (stage.EnclosedArea > 0.0) line += Format(L", area %.3f", stage.EnclosedArea);
+    const MiscloseFigures& figures = stage.misclose;
+    const bool heights = figures.FixedH > kNoHeight && figures.ObservedH > kNoHeight;
+    std::wstring line =
+        Format(L"%s: misclose E %s, N %s, H %s; %.3f at %.6f; length %.3f, %ld legs",
+               nedit::FromUtf8(title), Shown(figures.DiffE), Shown(figures.DiffN),
+               heights ? Shown(figures.DiffH) : L"none", figures.MiscloseDist,
+               figures.MiscloseBearing, figures.TraverseLength, figures.Setups);
+    if (!figures.Accuracy.empty()) line += L", accuracy " + figures.Accuracy;
+    if (figures.EnclosedArea > 0.0) line += Format(L", area %.3f", figures.EnclosedArea);
     return nedit::ToUtf8(line) + "\n";
 }
 

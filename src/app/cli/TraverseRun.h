@@ -17,6 +17,7 @@
 
 #include "PointOutput.h"
 #include "TraverseRequest.h"
+#include "traverse/UMisReportDlg.h"
 
 class ConsoleDialogHost;
 class UNeditDatabase;
@@ -28,17 +29,7 @@ class TraverseRoutes;
 /// The figures of one stage of the computation.
 struct TraverseStage {
     std::vector<PointRow> points;  // the route's entries
-    double DiffE = 0.0;
-    double DiffN = 0.0;
-    std::optional<double> DiffH;  // none when an end has no height
-    double MiscloseBearing = 0.0;
-    double MiscloseDist = 0.0;
-    double AngularError = 0.0;
-    double PerStation = 0.0;
-    double EnclosedArea = 0.0;
-    std::wstring Accuracy;
-    double TraverseLength = 0.0;
-    long Setups = 0;
+    MiscloseFigures misclose;
 };
 
 struct TraverseOutcome {
