@@ -37,9 +37,11 @@ double ZeroIfZero(double value) {
 }
 
 /// The accuracy ratio as the dialog shows it, cut to a whole number; a ratio beyond the
-/// whole numbers the text can hold shows the largest.
+/// whole numbers the text can hold shows the largest, and one of coordinates that are no
+/// numbers shows 0.
 std::wstring AccuracyText(double ratio) {
-    const double whole = ratio >= static_cast<double>(INT_MAX) ? INT_MAX : ratio;
+    double whole = std::isnan(ratio) ? 0.0 : ratio;
+    if (whole >= static_cast<double>(INT_MAX)) whole = INT_MAX;
     return nedit::Format(L"1:%d", static_cast<int>(whole));
 }
 
