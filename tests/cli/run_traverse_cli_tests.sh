@@ -40,6 +40,14 @@ passes adjust-json-result -- grep -q '"result": 11111' "$work/flags.json"
 passes adjust-json-rule -- grep -q '"rule": "compass"' "$work/flags.json"
 passes adjust-json-closes -- grep -q '"misclose": {"DiffE": 0, "DiffN": 0, .*"MiscloseDist": 0,' "$work/flags.json"
 
+# A link traverse with an angle check at its end: the angles balanced first, then the Compass
+# rule; C where tests/data/generate_traverse_surveys.py puts it by hand (E 1209.995597).
+printf '{"route": ["A", "B", "C", "E"], "FixedPt": "E", "FixedX": 1300, "FixedY": 2080, "FixedZ": 52,\n "AdjustAngle": 1, "ChkPt": "F", "CloseBearing": 48.81407483, "AdjustAngles": 1}\n' >"$work/link.json"
+"$sxnedit" traverse adjust "$data/traverse_link.neu" --params "$work/link.json" --json >"$work/link-out.json" 2>/dev/null
+passes link-after-angles -- grep -q '"after_angles": {' "$work/link-out.json"
+passes link-adjusted -- awk '/"adjusted": \{/ { a = 1 } a && /"id": "C"/ { exit !($0 ~ /"e": 1209\.9955(9[5-9]|60)/) }' "$work/link-out.json"
+passes link-angle-told -- grep -q 'angle check on F, known bearing 48.814075' "$work/link-out.json"
+
 # Left to the dialog, a loop closes on its start as re-observed: the messages say so.
 "$sxnedit" traverse adjust "$example" --route A,B,C,D,A --json >"$work/default.json" 2>/dev/null
 passes adjust-default-told -- grep -q 'so the traverse closes on itself and its misclose reads 0' "$work/default.json"

@@ -1,7 +1,9 @@
 #include "TraverseRun.h"
 
+#include <algorithm>
 #include <cmath>
 #include <functional>
+#include <optional>
 #include <unordered_set>
 
 #include "ConsoleDialogHost.h"
@@ -63,14 +65,8 @@ bool ChooseRoute(USelRouteDlg& dialog, const std::vector<std::wstring>& names,
     return false;
 }
 
-/// Acts on the route dialog as a user would on the values of `request`, in the dialog's
-/// order; false when the route cannot be chosen.
-bool ApplyRequest(USelRouteDlg& dialog, const TraverseRequest& request, ConsoleDialogHost& host) {
-    if (request.route.size() == 1) {
-        Tell(host, nedit::Translate(L"Invalid or empty traverse route !"));
-        return false;
-    }
-    if (!request.route.empty() && !ChooseRoute(dialog, request.route, host)) return false;
+/// The start, its coordinates and its orientation.
+void ApplyStart(USelRouteDlg& dialog, const TraverseRequest& request) {
     const std::optional<std::wstring> start =
         request.Start
             ? request.Start
@@ -89,7 +85,10 @@ bool ApplyRequest(USelRouteDlg& dialog, const TraverseRequest& request, ConsoleD
     } else if (request.UseBSCoord) {
         dialog.OnOrientationClicked(*request.UseBSCoord != 0);
     }
+}
 
+/// The end and the fixed point.
+void ApplyEnd(USelRouteDlg& dialog, const TraverseRequest& request) {
     const std::optional<std::wstring> end =
         request.EndStn
             ? request.EndStn
@@ -102,7 +101,11 @@ bool ApplyRequest(USelRouteDlg& dialog, const TraverseRequest& request, ConsoleD
     if (request.FixedY) dialog.FixedY = *request.FixedY;
     if (request.FixedZ) dialog.FixedZ = *request.FixedZ;
     if (request.FixedX || request.FixedY) dialog.OnCoordinatesChanged();
+}
 
+/// The angle check at the closing station.
+void ApplyAngleCheck(USelRouteDlg& dialog, const TraverseRequest& request,
+                     ConsoleDialogHost& host) {
     if (request.AdjustAngle) {
         if (*request.AdjustAngle != 0 && !dialog.IsEnabled(USelRouteDlg::kAdjustAngleBox)) {
             Tell(host, Format(L"The angle check needs a set-up at the end; %s is none, so "
@@ -136,6 +139,19 @@ bool ApplyRequest(USelRouteDlg& dialog, const TraverseRequest& request, ConsoleD
     } else if (request.UseCloseCoord) {
         dialog.OnCloseModeClicked(*request.UseCloseCoord != 0);
     }
+}
+
+/// Acts on the route dialog as a user would on the values of `request`, in the dialog's
+/// order; false when the route cannot be chosen.
+bool ApplyRequest(USelRouteDlg& dialog, const TraverseRequest& request, ConsoleDialogHost& host) {
+    if (request.route.size() == 1) {
+        Tell(host, nedit::Translate(L"Invalid or empty traverse route !"));
+        return false;
+    }
+    if (!request.route.empty() && !ChooseRoute(dialog, request.route, host)) return false;
+    ApplyStart(dialog, request);
+    ApplyEnd(dialog, request);
+    ApplyAngleCheck(dialog, request, host);
     if (request.Transit) {
         dialog.Transit = *request.Transit != 0 ? 1 : 0;
         dialog.Compass = dialog.Transit != 0 ? 0 : 1;
