@@ -26,6 +26,7 @@
 #include "report/NeditIni.h"
 #include "report/OutParamStruct.h"
 #include "report/ReportContext.h"
+#include "traverse/TraverseRoutes.h"
 
 class NamelessCoordinates;
 class UListCtrl;
@@ -81,9 +82,11 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     int SetupDataBase(UListCtrl* list);
     /// A new engine runs over a neutral file, read into the document's list.
     int SetupDataBase(const std::wstring& path);
-    /// Adds a stage of a higher room (routes, attachments) to every engine this document
-    /// builds from now on. The stage must outlive the document.
+    /// Adds a stage of a higher room (attachments) to every engine this document builds from
+    /// now on, after its own route discovery. The stage must outlive the document.
     void AddRunStage(nedit::RunStage* stage) { RunStages.push_back(stage); }
+    /// The traverse routes that the last run found, which every engine of the document finds.
+    nedit::TraverseRoutes& GetTraverseRoutes() { return Routes; }
     /// Offers to clear the report, then SetupDataBase(list).
     void Regenerate(UListCtrl* list);
     UNeditDatabase* GetDatabase() const { return Database.get(); }
@@ -193,6 +196,7 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     std::wstring NeuFileName;
     std::unique_ptr<UListCtrl> List;
     std::unique_ptr<UNeditDatabase> Database;
+    nedit::TraverseRoutes Routes{*this};
     std::vector<nedit::RunStage*> RunStages;
     std::unique_ptr<UNeditReport> NReport;
     OutParamStruct OutputParameters;

@@ -157,7 +157,17 @@ void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRo
         UseForAll = false;
         SetMinMaxCoord();
     }
-    if (result != 0 && findRoutes) RunStages(nedit::RunStep::Routes);
+    if (result != 0 && findRoutes) {
+        // The routes are found in the rows of this run, not in the record list.
+        GivenRows = &rows;
+        RunStages(nedit::RunStep::Routes);
+        GivenRows = nullptr;
+    }
+}
+
+const std::vector<std::wstring>* UNeditDatabase::GetRunRows() const {
+    if (GivenRows != nullptr) return GivenRows;
+    return Rows != nullptr ? &Rows->GetRows() : nullptr;
 }
 
 std::vector<std::wstring> UNeditDatabase::ContentRows() const {

@@ -11,6 +11,7 @@
 #include <memory>
 #include <string>
 #include <unordered_map>
+#include <unordered_set>
 #include <vector>
 
 #include "codes/ArcStore.h"
@@ -79,6 +80,9 @@ class UNeditDatabase {
     void SetOutput(bool output) { Output = output; }
     bool GetOutput() const { return Output; }
     void SetListCtrlPtr(nedit::RowSource* rows) { Rows = rows; }
+    /// The rows a run reads: while Generate runs, the rows it was given; otherwise those of
+    /// the record list. Null without either.
+    const std::vector<std::wstring>* GetRunRows() const;
     void SetReportPtr(UNeditReport* report) { Report = report; }
     UNeditReport* GetReport() const { return Report; }
     void SetFileName(const std::wstring& name) { FileName = name; }
@@ -137,6 +141,8 @@ class UNeditDatabase {
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
     void SetCurHMode(wchar_t mode) { HMode = mode; }
     void SetTravFlag(int flag) { TravFlag = flag; }
+    /// The text that marks a check shot in a code; empty while no code settings are loaded.
+    const std::wstring& GetChkShotCode() const { return ChkShotCode; }
     const std::wstring& GetDateText() const { return DateText; }
 
     // ---- Averaging --------------------------------------------------------------------
@@ -238,6 +244,14 @@ class UNeditDatabase {
     /// Forgets the adjusted points and deletes the rows from the lowest marker down.
     void DelAdjPts();
     void ClearAddPtList();
+    /// The positions of the last adjusted route become the traverse points, which the
+    /// re-reduction of side shots leaves where the adjustment put them. Null forgets them.
+    void UpdateTraversePoints(const std::vector<UNeditPt>* route);
+    /// The name is one of the traverse points, compared without regard to case.
+    bool IsTraversePoint(const std::wstring& name) const;
+    /// When `point`'s name is a traverse point: `point` becomes it (its name, position, no
+    /// code, no flags) and true is given.
+    bool GetTraversePoint(UNeditPt& point) const;
 
     const std::vector<UNeditPt>& GetPointList() const { return PointList.Items(); }
     const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList.Items(); }
@@ -323,6 +337,7 @@ class UNeditDatabase {
     bool Output = false;
     int ErrorCode = 0;
     std::vector<std::wstring> ContentLines;
+    const std::vector<std::wstring>* GivenRows = nullptr;  // Generate's rows, while it runs
 
     // The observation model: stations in list order, with a look-up by exact name.
     std::vector<std::unique_ptr<STNSTRUCT>> Stations;
@@ -349,6 +364,9 @@ class UNeditDatabase {
     nedit::PointStore PointList;
     nedit::PointStore AddPtList;
     nedit::PointStore TravPtList;
+    // The last adjusted route's points, and their names upper-cased for the look-up.
+    std::vector<UNeditPt> TravPtNames;
+    std::unordered_set<std::wstring> TravPtKeys;
     nedit::LineStore LineList;
     nedit::ArcStore ArcList;
     std::vector<UWCircle> CircleList;

@@ -11,6 +11,8 @@
 #include "ConsoleDialogHost.h"
 #include "ReductionOutput.h"
 #include "RunFiles.h"
+#include "TraverseOptions.h"
+#include "TraverseRun.h"
 #include "document/UListCtrl.h"
 #include "document/URawDataContainer.h"
 #include "platform/job/JobError.h"
@@ -105,6 +107,30 @@ int Reduce(OpenJob& open, const std::string& name, const std::string& report, bo
     return result == 1 ? exit_status::Ok : exit_status::Failed;
 }
 
+int Traverse(OpenJob& open, const std::string& name, const TraverseOptions& options) {
+    TraverseRequest request;
+    if (!ReadRequest(options, request)) return exit_status::Unreadable;
+    UNeditDoc* doc = Find(open, name);
+    if (doc == nullptr) return exit_status::Failed;
+    open.host.SetEcho(!options.json);
+    UListCtrl& list = doc->OpenList();
+    doc->SetupDataBase(&list);
+    const TraverseOutcome outcome =
+        RunTraverse(*doc->GetDatabase(), doc->GetTraverseRoutes(), open.host, request);
+    // Stored as the pane stores it after a traverse: adjusted points into the rows first.
+    if (!doc->SaveDocument()) {
+        std::fprintf(stderr, "sxnedit: the document %s could not be stored\n", name.c_str());
+        return exit_status::Failed;
+    }
+    const int status = WriteTraverseOutput(outcome, doc->GetNReport(), options, open.host,
+                                           doc->GetSettings().GetLengthDecimals());
+    if (!options.save.empty() && !doc->Save(Wide(options.save), &list)) {
+        std::fprintf(stderr, "sxnedit: cannot write %s\n", options.save.c_str());
+        return exit_status::Failed;
+    }
+    return status;
+}
+
 int Rename(OpenJob& open, const std::string& from, const std::string& to) {
     if (open.container->HasName(Wide(to))) {
         std::fprintf(stderr, "sxnedit: the job has a document %s already\n", to.c_str());
@@ -130,6 +156,7 @@ struct DocOptions {
     std::string other;   // the neutral file of an import, the new name of a rename
     std::string output;  // the file of an export, the report of a reduction
     bool json = false;
+    TraverseOptions traverse;
 };
 
 /// A doc command that opens the job and then does `work` on it.
@@ -140,7 +167,13 @@ CLI::App* AddDocCommand(CLI::App& doc, CommandRun& run, const std::shared_ptr<Do
     command->add_option("JOB", options->job, "the job file")->required();
     command->callback([options, work, &run] {
         run = [options, work] {
-            if (!RunFiles().Reads(options->job).Writes(options->output).Check()) {
+            if (!RunFiles()
+                     .Reads(options->job)
+                     .Reads(options->traverse.params)
+                     .Writes(options->output)
+                     .Writes(options->traverse.report)
+                     .Writes(options->traverse.save)
+                     .Check()) {
                 return exit_status::Failed;
             }
             OpenJob open;
@@ -185,6 +218,16 @@ void AddDocCommands(CLI::App& app, CommandRun& run) {
     reduce->add_flag("--json", options->json, "print the reduction's results as JSON");
     reduce->parse_complete_callback(
         [options] { CheckOutputOptions(options->output, options->json); });
+
+    CLI::App* traverse = AddDocCommand(
+        *doc, run, options, "traverse",
+        "reduce a stored document, adjust a traverse as 'traverse\n"
+        "adjust' does, and store the document",
+        [](OpenJob& open, const DocOptions& o) { return Traverse(open, o.name, o.traverse); });
+    traverse->add_option("NAME", options->name, "the document")->required();
+    AddTraverseOptions(*traverse, options->traverse);
+    traverse->parse_complete_callback(
+        [options] { CheckOutputOptions(options->traverse.report, options->traverse.json); });
 
     CLI::App* rename = AddDocCommand(
         *doc, run, options, "rename", "give a document another name",

@@ -104,18 +104,23 @@ void CheckOutputOptions(const std::string& reportPath, bool json) {
     }
 }
 
-int WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report,
-                         const ReductionOutputs& outputs, ConsoleDialogHost& host) {
-    const bool left_out = TellNonFinite(engine, host);
-    if (report != nullptr && outputs.report == "-") {
+bool WriteReport(const UNeditReport* report, const std::string& path) {
+    if (report == nullptr || path.empty()) return true;
+    if (path == "-") {
         std::string text = nedit::ToUtf8(report->GetText());
         if (!text.empty() && text.back() != '\n') text += '\n';
         std::fputs(text.c_str(), stdout);
-    } else if (report != nullptr && !outputs.report.empty() &&
-               !report->SaveAsText(outputs.report)) {
-        std::fprintf(stderr, "sxnedit: cannot write %s\n", outputs.report.c_str());
-        return exit_status::Failed;
+        return true;
     }
+    if (report->SaveAsText(path)) return true;
+    std::fprintf(stderr, "sxnedit: cannot write %s\n", path.c_str());
+    return false;
+}
+
+int WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report,
+                         const ReductionOutputs& outputs, ConsoleDialogHost& host) {
+    const bool left_out = TellNonFinite(engine, host);
+    if (!WriteReport(report, outputs.report)) return exit_status::Failed;
     if (outputs.json) {
         std::fputs(ReductionJson(engine, host.Messages()).c_str(), stdout);
     } else if (outputs.report != "-") {
