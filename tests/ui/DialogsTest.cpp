@@ -17,12 +17,11 @@
 #include "report/UOutputParamDlg.h"
 #include "ui/dialogs/ObjectInfoDialogs.h"
 #include "ui/dialogs/UDisplaySettingsDlg.h"
-#include "ui/dialogs/UEditRecordDlg.h"
 #include "ui/dialogs/UGetNameDlg.h"
 #include "ui/forms/BackBearingForm.h"
 #include "ui/forms/CoordEntryForm.h"
-#include "ui/forms/NumberField.h"
 #include "ui/forms/ReportParametersForm.h"
+#include "ui/forms/UEdit.h"
 
 using namespace nedit;
 using nedit::test::ScriptedHost;
@@ -51,7 +50,6 @@ class DialogsTest : public QObject {
     void arcDialogGivesTheArcsMeasures();
     void pointDialogPutsNorthingFirstForOrderOne();
     void documentNamesAreChecked();
-    void recordDialogSplitsAndJoinsFields();
     void messageBoxesAnswerWithTheirButtons();
     void coordinateFormTakesTypedValues();
     void coordinateFormWithFixedCheckHidesApplyToAll();
@@ -148,19 +146,6 @@ void DialogsTest::documentNamesAreChecked() {
     QVERIFY(!save.OnOK());
 }
 
-void DialogsTest::recordDialogSplitsAndJoinsFields() {
-    UEditRecordDlg dialog;
-    QVERIFY(dialog.LoadRecord(L"SS        ID=P1,HA=72.46454,CO=FC01"));
-    QCOMPARE(static_cast<int>(dialog.Record.fields.size()), 3);
-    QCOMPARE(dialog.Record.fields[1].name, std::wstring(L"HA"));
-    dialog.Record.fields[2].value = L"FENCE";
-    QCOMPARE(dialog.GetRecordText(), std::wstring(L"SS ID=P1,HA=72.46454,CO=FENCE"));
-    QVERIFY(dialog.LoadRecord(L"SCALE     0.99960"));
-    QCOMPARE(dialog.Record.fields.front().name, std::wstring());
-    QCOMPARE(dialog.GetRecordText(), std::wstring(L"SCALE 0.99960"));
-    QVERIFY(!dialog.LoadRecord(L"# a comment"));
-}
-
 void DialogsTest::messageBoxesAnswerWithTheirButtons() {
     ScriptedHost host;
     // Without an answer the default button decides: the second of Yes, No.
@@ -203,7 +188,7 @@ void DialogsTest::coordinateFormTakesTypedValues() {
 void DialogsTest::coordinateFormWithFixedCheckHidesApplyToAll() {
     UCoordEntryDlg dialog(UCoordEntryDlg::kNorthFirstId, nullptr);
     dialog.SetHasFixedPointCheck();
-    CoordEntryForm form(dialog, nullptr);
+    CoordEntryForm form(dialog, {}, nullptr);
     QVERIFY(form.ApplyToAllBox() == nullptr);
     const QList<QCheckBox*> boxes = form.findChildren<QCheckBox*>();
     QCOMPARE(boxes.size(), 1);
@@ -217,7 +202,7 @@ void DialogsTest::coordinateFormWithFixedCheckHidesApplyToAll() {
 void DialogsTest::backBearingFormReadsTheJobsAngleUnit() {
     UJobSettings settings;  // ddd.mmss
     UBKBCoordDlg dialog(L"D");
-    BackBearingForm form(dialog, &settings, nullptr);
+    BackBearingForm form(dialog, {&settings, nullptr}, nullptr);
     QVERIFY(!form.BearingField()->isEnabled());
     form.ApplyBearingBox()->setChecked(true);
     QVERIFY(form.BearingField()->isEnabled());
@@ -232,7 +217,7 @@ void DialogsTest::reportParametersFormStoresTheColumns() {
     OutParamStruct parameters;
     parameters.AngularUnit = 2;
     UOutputParamDlg dialog(parameters);
-    ReportParametersForm form(dialog, nullptr);
+    ReportParametersForm form(dialog, {}, nullptr);
     const QList<QRadioButton*> radios = form.findChildren<QRadioButton*>();
     QVERIFY(radios.at(2)->isChecked());  // "Gon"
     form.ColumnBox(opt::LN)->setChecked(false);
