@@ -149,7 +149,10 @@ void UNeditDlgView::ShowFields() {
             captions_.push_back(caption);
             edits_.push_back(edit);
         }
-        for (int column = 0; column < kFieldsPerLine; ++column) grid_->setColumnStretch(column, 1);
+        // The fields share the width of the form between them.
+        const int used = std::min(static_cast<int>(fields.size()) * span, kFieldsPerLine);
+        for (int column = 0; column < kFieldsPerLine; ++column)
+            grid_->setColumnStretch(column, column < used ? 1 : 0);
     }
     for (std::size_t i = 0; i < fields.size(); ++i) {
         edits_[i]->SetAngleUnit(angles);

@@ -21,6 +21,7 @@
 #include "ui/forms/BackBearingForm.h"
 #include "ui/forms/CoordEntryForm.h"
 #include "ui/forms/ReportParametersForm.h"
+#include "ui/forms/UDlgMaker.h"
 #include "ui/forms/UEdit.h"
 
 using namespace nedit;
@@ -53,6 +54,7 @@ class DialogsTest : public QObject {
     void messageBoxesAnswerWithTheirButtons();
     void coordinateFormTakesTypedValues();
     void coordinateFormWithFixedCheckHidesApplyToAll();
+    void coordinateFormWalksTheJobsCoordinateOrder();
     void backBearingFormReadsTheJobsAngleUnit();
     void reportParametersFormStoresTheColumns();
     void aDialogWithoutAFormTakesItsDefaults();
@@ -197,6 +199,41 @@ void DialogsTest::coordinateFormWithFixedCheckHidesApplyToAll() {
     // Cancel leaves the dialog's result alone.
     form.reject();
     QCOMPARE(dialog.getEast(), 0.0);
+}
+
+void DialogsTest::coordinateFormWalksTheJobsCoordinateOrder() {
+    UJobSettings feet;
+    feet.SetLengthUnit(LengthUnit::Feet);
+    UCoordEntryDlg dialog(UCoordEntryDlg::kNorthFirstId, nullptr);
+    dialog.InitXYZSvy(10.0, 20.0, UWPoint::kNoHeight, L"");
+    CoordEntryForm form(dialog, {&feet, nullptr}, nullptr);
+    // The job's point is offered and chosen: the typed row waits for its radio.
+    QVERIFY(form.SourceButton(UCoordEntryDlg::Source::Database)->isChecked());
+    QVERIFY(!form.EnteredField(0)->isEnabled());
+    QCOMPARE(form.Field(UCoordEntryDlg::Source::Database, 1)->text(), QStringLiteral("20.000"));
+    QCOMPARE(form.Field(UCoordEntryDlg::Source::Database, 2)->text(), QString());  // no height
+    QCOMPARE(form.EnteredField(0)->Unit(), QStringLiteral("ft"));
+    form.SourceButton(UCoordEntryDlg::Source::Enter)->setChecked(true);
+    QCOMPARE(dialog.GetSelectedSource(), UCoordEntryDlg::Source::Enter);
+    QVERIFY(form.EnteredField(0)->isEnabled());
+    // Northing first: Tab goes from the northing to the easting, then to the height.
+    const auto next = [](QWidget* widget) {
+        do {
+            widget = widget->nextInFocusChain();
+        } while (!(widget->focusPolicy() & Qt::TabFocus) || !widget->isEnabled());
+        return widget;
+    };
+    QCOMPARE(next(form.EnteredField(1)), form.EnteredField(0));
+    QCOMPARE(next(form.EnteredField(0)), form.EnteredField(2));
+    // Typed values go to the dialog at once; values the dialog is given show when told.
+    form.EnteredField(1)->setText(QStringLiteral("2000.5"));
+    QCOMPARE(dialog.RowOf(UCoordEntryDlg::Source::Enter).North, 2000.5);
+    dialog.InitXYZ(1.0, 2.0, 3.0, L"");
+    form.Maker().UpdateData(false);
+    QCOMPARE(form.EnteredField(2)->text(), QStringLiteral("3.000"));
+    form.accept();
+    QCOMPARE(dialog.getZ(), 3.0);
+    QCOMPARE(dialog.GetChosenSource(), UCoordEntryDlg::Source::Enter);
 }
 
 void DialogsTest::backBearingFormReadsTheJobsAngleUnit() {

@@ -293,9 +293,7 @@ void InstrumentFormsTest::aDownloadShowsItsProgressAndStopsAtAbort() {
         PortsStore().SetDevicePath(L"COM1", instrument.Port());
         host.SetFormScript(QStringLiteral("Download Parameters"), [](QDialog& dialog) {
             auto& form = static_cast<DownloadForm&>(dialog);
-            form.List(UNEDownload::kInstrumentList)->setCurrentText(QStringLiteral("Leica GSI"));
-            form.List(UNEDownload::kPortList)->setCurrentText(QStringLiteral("COM1"));
-            form.SaveRawBox()->setChecked(false);
+            test::ChooseGsiOnCom1(form);
             form.accept();
             return form.result();
         });

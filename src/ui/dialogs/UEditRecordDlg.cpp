@@ -161,6 +161,7 @@ void UEditRecordDlg::MakeFieldWindows() {
     Windows.clear();
     if (ShowsUnitChoices() || ShowsModeChoices()) return;
     const LengthUnit job_length = Job != nullptr ? Job->GetLengthUnit() : LengthUnit::Metres;
+    const AngleUnit job_angle = Job != nullptr ? Job->GetAngleUnit() : AngleUnit::DegMinSec;
     for (std::size_t i = 0; i < Fields.size(); ++i) {
         UFieldWindow window;
         window.Name = Fields[i].Name;
@@ -172,6 +173,10 @@ void UEditRecordDlg::MakeFieldWindows() {
         if ((angle || length || window.Edit == Control::Long) && ReadsAsNumber(window.Value)) {
             const double value = TextToDouble(window.Value);
             window.HasNumber = true;
+            const bool as_kept = angle ? Units.angle == job_angle &&
+                                             (window.Id != fld::VA || Units.verticalMode == L'Z')
+                                       : !length || Units.length == job_length;
+            if (as_kept) window.Decimals = DecimalsOf(window.Value);
             if (window.Id == fld::VA) {
                 window.Number = Units.ToZenith(ToDegrees(value, Units.angle));
             } else if (angle) {

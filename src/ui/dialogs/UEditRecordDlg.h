@@ -8,8 +8,9 @@
 // Decisions:
 // - Values are read in the units and vertical mode in force at the record's row and a
 //   changed value is written back in them, so the row keeps meaning what its file says
-//   whatever the job's units are. A changed value keeps the places typed, and at least the
-//   job's; a field that was not changed keeps its text as it was, to the last digit.
+//   whatever the job's units are. A value kept in the job's unit shows every place it has;
+//   a changed value keeps the places typed, and at least the job's; a field that was not
+//   changed keeps its text as it was, to the last digit.
 // - A bare value (without "NAME=") is named by its place in the record's layout, and comes
 //   back named so; a record of a single field ("SCALE     0.99960") has one field named by
 //   its key and comes back as its key and the value.
@@ -58,6 +59,9 @@ class UEditRecordDlg : public UDialogLogic {
         std::wstring Value;
         /// The record's text reads as a number, which Number holds.
         bool HasNumber = false;
+        /// The places the value shows at least: those of the record's text when the record
+        /// keeps it in the job's unit, so that what is shown is all the record holds.
+        int Decimals = 0;
         /// Typed in since the dialog opened.
         bool Edited = false;
     };

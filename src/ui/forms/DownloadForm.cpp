@@ -10,7 +10,6 @@
 #include <QPushButton>
 #include <QVBoxLayout>
 
-#include "instruments/PortStores.h"
 #include "ui/forms/UDlgMaker.h"
 
 namespace nedit {
@@ -46,18 +45,8 @@ DownloadForm::DownloadForm(UNEDownload& dialog, const FormContext& context, QWid
 
     auto* link = new QGroupBox(QStringLiteral("Port Settings"), this);
     auto* values = new QFormLayout(link);
-    baud_ = maker.List("TEXT", dialog_.Baud, dialog_.GetItems(UNEDownload::kBaudList), true);
-    data_bits_ =
-        maker.List("TEXT", dialog_.DataBits, dialog_.GetItems(UNEDownload::kDataBitList), false);
-    stop_bits_ =
-        maker.List("TEXT", dialog_.StopBits, dialog_.GetItems(UNEDownload::kStopBitList), false);
-    parity_ = maker.List("TEXT", dialog_.Parity, dialog_.GetItems(UNEDownload::kParityList), false);
-    flow_ = maker.List("TEXT", dialog_.Flow, dialog_.GetItems(UNEDownload::kFlowList), false);
-    values->addRow(QStringLiteral("Baud Rate"), baud_);
-    values->addRow(QStringLiteral("Data Bit"), data_bits_);
-    values->addRow(QStringLiteral("Stop Bit"), stop_bits_);
-    values->addRow(QStringLiteral("Parity"), parity_);
-    values->addRow(QStringLiteral("Flow Control"), flow_);
+    values_ = PortValueFields::Make(maker, values, dialog_.Baud, dialog_.DataBits, dialog_.StopBits,
+                                    dialog_.Parity, dialog_.Flow);
     layout->addWidget(link);
 
     save_raw_ = maker.Check("CHECK,1", QStringLiteral("Save Raw Data File"), dialog_.SaveRaw);
@@ -84,15 +73,15 @@ QComboBox* DownloadForm::List(int id) const {
         case UNEDownload::kPortList:
             return port_;
         case UNEDownload::kBaudList:
-            return baud_;
+            return values_.baud;
         case UNEDownload::kDataBitList:
-            return data_bits_;
+            return values_.dataBits;
         case UNEDownload::kStopBitList:
-            return stop_bits_;
+            return values_.stopBits;
         case UNEDownload::kParityList:
-            return parity_;
+            return values_.parity;
         case UNEDownload::kFlowList:
-            return flow_;
+            return values_.flow;
         default:
             return nullptr;
     }
@@ -106,8 +95,7 @@ void DownloadForm::InstrumentChosen(const QString& instrument) {
 }
 
 void DownloadForm::ShowDevice() {
-    device_->setText(
-        QStringLiteral("(%1)").arg(QString::fromStdString(PortsStore().DevicePath(dialog_.Comm))));
+    device_->setText(PortValueFields::DeviceText(dialog_.Comm));
 }
 
 void DownloadForm::Refused() {

@@ -7,6 +7,7 @@
 
 #include "instruments/UNEDownload.h"
 #include "ui/forms/LogicForm.h"
+#include "ui/forms/PortValueFields.h"
 
 class QCheckBox;
 class QComboBox;
@@ -38,11 +39,7 @@ class DownloadForm : public LogicForm {
     UNEDownload& dialog_;
     QComboBox* instrument_ = nullptr;
     QComboBox* port_ = nullptr;
-    QComboBox* baud_ = nullptr;
-    QComboBox* data_bits_ = nullptr;
-    QComboBox* stop_bits_ = nullptr;
-    QComboBox* parity_ = nullptr;
-    QComboBox* flow_ = nullptr;
+    PortValueFields values_;
     QCheckBox* save_raw_ = nullptr;
     QCheckBox* ack_nak_ = nullptr;
     QPushButton* detail_ = nullptr;

@@ -45,7 +45,7 @@ DownloadProgressWindow::DownloadProgressWindow(const UListCtrl& list, const UDev
     layout->addLayout(figures);
     layout->addWidget(quiet_);
     last_->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
-    last_->setMinimumWidth(last_->fontMetrics().horizontalAdvance(QLatin1Char('0')) * 60);
+    last_->setMinimumWidth(last_->fontMetrics().horizontalAdvance(QLatin1Char('0')) * 80);
     auto* buttons = new QHBoxLayout();
     buttons->addStretch(1);
     buttons->addWidget(abort_);

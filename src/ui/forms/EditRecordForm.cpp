@@ -46,13 +46,6 @@ const char* LinkOf(Control control) {
     }
 }
 
-QGroupBox* ChoiceBox(const QString& title, QButtonGroup* group, QWidget* parent) {
-    auto* box = new QGroupBox(title, parent);
-    auto* layout = new QVBoxLayout(box);
-    for (QAbstractButton* button : group->buttons()) layout->addWidget(button);
-    return box;
-}
-
 }  // namespace
 
 QString EditRecordForm::Description(int fieldId) {
@@ -123,8 +116,8 @@ EditRecordForm::EditRecordForm(UEditRecordDlg& dialog, const FormContext& contex
                                   {{0, QStringLiteral("Deg Min Sec")},
                                    {1, QStringLiteral("Decimal Degrees")},
                                    {2, QStringLiteral("Gon")}});
-            choices->addWidget(ChoiceBox(QStringLiteral("Linear"), first_, this));
-            choices->addWidget(ChoiceBox(QStringLiteral("Angular"), second_, this));
+            choices->addWidget(UDlgMaker::RadioBox(QStringLiteral("Linear"), first_, this));
+            choices->addWidget(UDlgMaker::RadioBox(QStringLiteral("Angular"), second_, this));
         } else {
             first_ = maker.Radio(
                 "RADIO,1,", dialog_.HorizontalChoice,
@@ -133,8 +126,10 @@ EditRecordForm::EditRecordForm(UEditRecordDlg& dialog, const FormContext& contex
                                   {{2, QStringLiteral("Zenith")},
                                    {4, QStringLiteral("Vertical")},
                                    {3, QStringLiteral("Nadir")}});
-            choices->addWidget(ChoiceBox(QStringLiteral("Horizontal Angle"), first_, this));
-            choices->addWidget(ChoiceBox(QStringLiteral("Vertical Angle"), second_, this));
+            choices->addWidget(
+                UDlgMaker::RadioBox(QStringLiteral("Horizontal Angle"), first_, this));
+            choices->addWidget(
+                UDlgMaker::RadioBox(QStringLiteral("Vertical Angle"), second_, this));
         }
         layout->addLayout(choices);
     } else {
@@ -142,20 +137,12 @@ EditRecordForm::EditRecordForm(UEditRecordDlg& dialog, const FormContext& contex
         fields->setLabelAlignment(Qt::AlignLeft);
         for (UEditRecordDlg::UFieldWindow& window : dialog_.Windows) {
             const char* link = LinkOf(window.Edit);
-            UEdit* edit = nullptr;
-            if (UDlgMaker::KindOf(link) >= UEdit::Kind::Long) {
-                edit = maker.Edit(
-                    link, [&window] { return window.Number; },
-                    [&window](double value) { window.Number = value; });
-                // A number the record does not hold shows as the record has it.
-                if (!window.HasNumber) edit->setText(QString::fromStdWString(window.Value));
-            } else {
-                edit = maker.Edit(link, window.Value);
-            }
-            connect(edit, &QLineEdit::textChanged, this, [&window](const QString& text) {
-                window.Value = text.toStdWString();
-                window.Edited = true;
-            });
+            UEdit* edit = UDlgMaker::KindOf(link) >= UEdit::Kind::Long
+                              ? maker.Edit(
+                                    link, [&window] { return window.Number; },
+                                    [&window](double value) { window.Number = value; })
+                              : maker.Edit(link, window.Value);
+            edit->SetMinimumDecimals(window.Decimals);
             edit->setMinimumWidth(edit->fontMetrics().horizontalAdvance(QLatin1Char('0')) * 22);
             const QString description = Description(window.Id);
             const QString name = QString::fromStdWString(window.Name);
@@ -165,6 +152,18 @@ EditRecordForm::EditRecordForm(UEditRecordDlg& dialog, const FormContext& contex
                                      .arg(name, description),
                            edit);
             edits_.push_back(edit);
+        }
+        // Shown again with the places of each value; a number the record does not hold
+        // shows as the record has it. Only what the user types afterwards is an edit.
+        maker.UpdateData(false);
+        for (std::size_t i = 0; i < edits_.size(); ++i) {
+            UEditRecordDlg::UFieldWindow& window = dialog_.Windows[i];
+            if (edits_[i]->IsNumber() && !window.HasNumber)
+                edits_[i]->setText(QString::fromStdWString(window.Value));
+            connect(edits_[i], &QLineEdit::textChanged, this, [&window](const QString& text) {
+                window.Value = text.toStdWString();
+                window.Edited = true;
+            });
         }
         layout->addLayout(fields);
     }

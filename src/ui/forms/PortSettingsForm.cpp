@@ -6,7 +6,6 @@
 #include <QLabel>
 #include <QVBoxLayout>
 
-#include "instruments/PortStores.h"
 #include "ui/forms/UDlgMaker.h"
 
 namespace nedit {
@@ -30,18 +29,8 @@ PortSettingsForm::PortSettingsForm(USetComm& dialog, const FormContext& context,
     port_line->addWidget(port_);
     port_line->addWidget(device_, 1);
     values->addRow(QStringLiteral("Port"), port_line);
-    baud_ = maker.List("TEXT", dialog_.Baud, dialog_.GetItems(USetComm::kBaudList), true);
-    data_bits_ =
-        maker.List("TEXT", dialog_.DataBits, dialog_.GetItems(USetComm::kDataBitList), false);
-    stop_bits_ =
-        maker.List("TEXT", dialog_.StopBits, dialog_.GetItems(USetComm::kStopBitList), false);
-    parity_ = maker.List("TEXT", dialog_.Parity, dialog_.GetItems(USetComm::kParityList), false);
-    flow_ = maker.List("TEXT", dialog_.Flow, dialog_.GetItems(USetComm::kFlowList), false);
-    values->addRow(QStringLiteral("Baud Rate"), baud_);
-    values->addRow(QStringLiteral("Data Bits"), data_bits_);
-    values->addRow(QStringLiteral("Stop Bits"), stop_bits_);
-    values->addRow(QStringLiteral("Parity"), parity_);
-    values->addRow(QStringLiteral("Flow Control"), flow_);
+    values_ = PortValueFields::Make(maker, values, dialog_.Baud, dialog_.DataBits, dialog_.StopBits,
+                                    dialog_.Parity, dialog_.Flow);
     layout->addLayout(values);
     AddButtons(layout);
     connect(port_, &QComboBox::currentTextChanged, this, &PortSettingsForm::PortChosen);
@@ -53,15 +42,15 @@ QComboBox* PortSettingsForm::List(int id) const {
         case USetComm::kPortList:
             return port_;
         case USetComm::kBaudList:
-            return baud_;
+            return values_.baud;
         case USetComm::kDataBitList:
-            return data_bits_;
+            return values_.dataBits;
         case USetComm::kStopBitList:
-            return stop_bits_;
+            return values_.stopBits;
         case USetComm::kParityList:
-            return parity_;
+            return values_.parity;
         case USetComm::kFlowList:
-            return flow_;
+            return values_.flow;
         default:
             return nullptr;
     }
@@ -74,8 +63,7 @@ void PortSettingsForm::PortChosen(const QString& port) {
 }
 
 void PortSettingsForm::ShowDevice() {
-    device_->setText(QStringLiteral("(%1)").arg(
-        QString::fromStdString(PortsStore().DevicePath(dialog_.GetPort()))));
+    device_->setText(PortValueFields::DeviceText(dialog_.GetPort()));
 }
 
 }  // namespace nedit

@@ -5,6 +5,7 @@
 
 #include "instruments/USetComm.h"
 #include "ui/forms/LogicForm.h"
+#include "ui/forms/PortValueFields.h"
 
 class QComboBox;
 class QLabel;
@@ -26,11 +27,7 @@ class PortSettingsForm : public LogicForm {
 
     USetComm& dialog_;
     QComboBox* port_ = nullptr;
-    QComboBox* baud_ = nullptr;
-    QComboBox* data_bits_ = nullptr;
-    QComboBox* stop_bits_ = nullptr;
-    QComboBox* parity_ = nullptr;
-    QComboBox* flow_ = nullptr;
+    PortValueFields values_;
     QLabel* device_ = nullptr;
 };
 

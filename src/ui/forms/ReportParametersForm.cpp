@@ -35,13 +35,6 @@ constexpr Column kCoordinateColumns[] = {
     {opt::HC, "Elevation"},
 };
 
-QGroupBox* RadioBox(const QString& title, QButtonGroup* group, QWidget* parent) {
-    auto* box = new QGroupBox(title, parent);
-    auto* layout = new QVBoxLayout(box);
-    for (QAbstractButton* button : group->buttons()) layout->addWidget(button);
-    return box;
-}
-
 }  // namespace
 
 ReportParametersForm::ReportParametersForm(UOutputParamDlg& dialog, const FormContext& context,
@@ -55,10 +48,10 @@ ReportParametersForm::ReportParametersForm(UOutputParamDlg& dialog, const FormCo
                            {{0, QStringLiteral("DDD MM SS")},
                             {1, QStringLiteral("Decimal Degree")},
                             {2, QStringLiteral("Gon")}});
-    units->addWidget(RadioBox(QStringLiteral("Angular  Output Units"), angular_, this));
+    units->addWidget(UDlgMaker::RadioBox(QStringLiteral("Angular  Output Units"), angular_, this));
     linear_ = maker.Radio("RADIO,1,", dialog_.LinearRadio,
                           {{0, QStringLiteral("Meters")}, {1, QStringLiteral("Feet")}});
-    units->addWidget(RadioBox(QStringLiteral("Linear Output Units"), linear_, this));
+    units->addWidget(UDlgMaker::RadioBox(QStringLiteral("Linear Output Units"), linear_, this));
     layout->addLayout(units);
     auto add_columns = [this, layout, &maker](const QString& title, const auto& columns) {
         auto* box = new QGroupBox(title, this);

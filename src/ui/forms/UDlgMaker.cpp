@@ -3,7 +3,9 @@
 #include <QButtonGroup>
 #include <QCheckBox>
 #include <QComboBox>
+#include <QGroupBox>
 #include <QRadioButton>
+#include <QVBoxLayout>
 #include <memory>
 #include <stdexcept>
 
@@ -168,6 +170,13 @@ QButtonGroup* UDlgMaker::Radio(std::string_view definition, std::function<int()>
               if (group->checkedId() != -1) set(group->checkedId());
           }});
     return group;
+}
+
+QGroupBox* UDlgMaker::RadioBox(const QString& title, QButtonGroup* group, QWidget* parent) {
+    auto* box = new QGroupBox(title, parent);
+    auto* layout = new QVBoxLayout(box);
+    for (QAbstractButton* button : group->buttons()) layout->addWidget(button);
+    return box;
 }
 
 void UDlgMaker::UpdateData(bool save) {

@@ -31,6 +31,7 @@
 class QButtonGroup;
 class QCheckBox;
 class QComboBox;
+class QGroupBox;
 class UJobSettings;
 
 namespace nedit {
@@ -70,6 +71,9 @@ class UDlgMaker : public QObject {
     QButtonGroup* Radio(std::string_view definition, std::function<int()> get,
                         std::function<void(int)> set,
                         const std::vector<std::pair<int, QString>>& choices);
+
+    /// A box titled `title` with the buttons of a radio group one under the other.
+    static QGroupBox* RadioBox(const QString& title, QButtonGroup* group, QWidget* parent);
 
     /// With `save`, every control's value goes to its member; else every member is shown.
     void UpdateData(bool save);

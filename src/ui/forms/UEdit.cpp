@@ -4,6 +4,7 @@
 #include <QRegularExpression>
 #include <QStyle>
 #include <QStyleOptionFrame>
+#include <algorithm>
 #include <cmath>
 
 #include "platform/format/UFormatAngle.h"
@@ -86,13 +87,16 @@ void UEdit::SetValue(double value) {
         setText(QString::number(std::lround(value)));
     } else if (IsAngle()) {
         if (kind_ == Kind::Bearing) value = std::fmod(std::fmod(value, 360.0) + 360.0, 360.0);
-        const int decimals = job_ != nullptr ? job_->GetAngleDecimals() : 4;
+        const int decimals =
+            std::max(job_ != nullptr ? job_->GetAngleDecimals() : 4, minimum_decimals_);
         const UFormatAngle format(IndexOf(angle_unit_), decimals, 0);
         setText(QString::fromStdWString(format.ConvertToDisplayString(DoubleToText(value))));
     } else if (kind_ == Kind::Elevation && value <= UWPoint::kNoHeight) {
         clear();
     } else if (IsLength()) {
-        setText(QString::number(value, 'f', job_ != nullptr ? job_->GetLengthDecimals() : 3));
+        const int decimals =
+            std::max(job_ != nullptr ? job_->GetLengthDecimals() : 3, minimum_decimals_);
+        setText(QString::number(value, 'f', decimals));
     } else {
         setText(QString::fromStdWString(DoubleToText(value)));
     }

@@ -56,6 +56,8 @@ class UEdit : public QLineEdit {
     /// text and plain numbers.
     QString Unit() const;
 
+    /// SetValue shows at least this many places (a record's own value shows all it holds).
+    void SetMinimumDecimals(int decimals) { minimum_decimals_ = decimals; }
     /// Shows `value`: degrees in the angle unit (a bearing brought into 0 to 360), a length
     /// as it is, with the job's decimals; an elevation of no height as an empty field.
     void SetValue(double value);
@@ -75,6 +77,7 @@ class UEdit : public QLineEdit {
     Kind kind_;
     const UJobSettings* job_;
     AngleUnit angle_unit_;
+    int minimum_decimals_ = 0;
 };
 
 }  // namespace nedit

@@ -25,13 +25,6 @@ constexpr int kByHeight = 1025;
 constexpr int kByWindow = 1120;
 constexpr int kByScreen = 1121;
 
-QGroupBox* RadioBox(const QString& title, QButtonGroup* group, QWidget* parent) {
-    auto* box = new QGroupBox(title, parent);
-    auto* layout = new QVBoxLayout(box);
-    for (QAbstractButton* button : group->buttons()) layout->addWidget(button);
-    return box;
-}
-
 }  // namespace
 
 UploadSelectionForm::UploadSelectionForm(UUploadSource& dialog, const FormContext& context,
@@ -45,13 +38,13 @@ UploadSelectionForm::UploadSelectionForm(UUploadSource& dialog, const FormContex
     source_ = maker.Radio("RADIO,1,", dialog_.Source,
                           {{UUploadSource::kDatabase, QStringLiteral("Database")},
                            {UUploadSource::kFile, QStringLiteral("File")}});
-    top->addWidget(RadioBox(QStringLiteral("Upload From"), source_, this));
+    top->addWidget(UDlgMaker::RadioBox(QStringLiteral("Upload From"), source_, this));
     layers_ =
         maker.Radio("RADIO,1,", dialog_.AllLayer,
                     {{UUploadSource::kAllLayers, QStringLiteral("All Layers")},
                      {UUploadSource::kLayersOn, QStringLiteral("All Layers Currently On")},
                      {UUploadSource::kLayersOff, QStringLiteral("All Layers Currently Off")}});
-    top->addWidget(RadioBox(QStringLiteral("Upload Layers Criteria"), layers_, this));
+    top->addWidget(UDlgMaker::RadioBox(QStringLiteral("Upload Layers Criteria"), layers_, this));
     layout->addLayout(top);
 
     auto* points = new QGroupBox(QStringLiteral("Points Upload Selection"), this);
