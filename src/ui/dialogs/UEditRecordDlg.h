@@ -15,6 +15,9 @@
 //   back named so; a record of a single field ("SCALE     0.99960") has one field named by
 //   its key and comes back as its key and the value.
 // - The last value of a record counts like every other, whether a blank follows it or not.
+// - The text goes into the row through the list's gate, as every change does, so the row is
+//   laid out as all rows are; and the change marks the document modified and is a step of
+//   the undo history, so that closing asks to save it and Ctrl+Z takes it back.
 
 #include <string>
 #include <vector>
