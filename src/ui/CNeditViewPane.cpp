@@ -75,6 +75,7 @@ CNeditViewPane::CNeditViewPane(UNeditDoc* doc, QtDialogHost* host, QtProgressSin
     Events.Add(ListView->Model());
     Events.Add(Recorder);
     ListView->SetRecorder(Recorder);
+    DlgView->SetDoc(Document);
     DlgView->SetRecorder(Recorder);
 
     connect(Recorder, &RowEditRecorder::rowsChanged, this, &CNeditViewPane::MarkModified);
@@ -90,6 +91,8 @@ CNeditViewPane::CNeditViewPane(UNeditDoc* doc, QtDialogHost* host, QtProgressSin
     connect(ListView, &UNeditView::focusFormRequested, this, [this] {
         if (QWidget* field = DlgView->FieldEdit(0)) field->setFocus();
     });
+    connect(DlgView, &UNeditDlgView::listFocusWanted, ListView,
+            [this] { ListView->setFocus(Qt::OtherFocusReason); });
     connect(GraphView, &UNeditGraphView::objectPicked, this,
             [this](const PlanPick& pick) { SetSelected(pick); });
     connect(GraphView, &UNeditGraphView::objectInfoRequested, this, &CNeditViewPane::OnObjectInfo);
@@ -108,6 +111,7 @@ void CNeditViewPane::Detach() {
     blockSignals(true);
     if (FindDlg) FindDlg->close();
     if (ReportView) ReportView->close();
+    Instruments.reset();
     if (ListCtrl != nullptr) {
         ListCtrl->SetEvents(nullptr);
         ListCtrl->SetRecordForm(nullptr);
@@ -119,6 +123,7 @@ void CNeditViewPane::Detach() {
         Recorder->SetList(nullptr);
     }
     GraphView->SetDoc(nullptr);
+    DlgView->SetDoc(nullptr);
     Document->SetProgressSink(nullptr);
 }
 
@@ -148,6 +153,8 @@ void CNeditViewPane::WireList() {
     ListView->SetList(ListCtrl);
     DlgView->SetList(ListCtrl);
     Recorder->SetList(ListCtrl);
+    UTransferView* view = this;
+    Instruments = std::make_unique<UInstrumentCommands>(*Document, *ListCtrl, Host, view);
 }
 
 void CNeditViewPane::Start() {
@@ -222,6 +229,10 @@ int CNeditViewPane::Reduce(const QString& stage, const std::function<int()>& run
     const int result = RunLong(stage, run);
     GraphView->DatabaseReplaced();
     if (ReportView) ReportView->UpdateReport();
+    // The form shows angles in the unit the run read last, as the file's records give it.
+    const UNeditDatabase* database = Document->GetDatabase();
+    DlgView->SetAngType(database != nullptr ? database->GetAngleType()
+                                            : IndexOf(Document->GetSettings().GetAngleUnit()));
     return result;
 }
 

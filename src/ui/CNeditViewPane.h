@@ -27,6 +27,7 @@
 #include <string>
 
 #include "document/ProfileStore.h"
+#include "document/UInstrumentCommands.h"
 #include "ui/ListEventFan.h"
 #include "ui/PlanScene.h"
 
@@ -49,7 +50,7 @@ class UNeditGraphView;
 class UNeditView;
 class UReportView;
 
-class CNeditViewPane : public QWidget {
+class CNeditViewPane : public QWidget, private UTransferView {
     Q_OBJECT
   public:
     /// Asks for a file: to open one (`save` false) or to write one, with a title, a filter
@@ -109,6 +110,11 @@ class CNeditViewPane : public QWidget {
     /// With the job's coordinate order 1, the E, N and H parts of a template change places so
     /// that northing comes first; with order 0 the text is given back as it is.
     static std::wstring CheckCoordinateOrder(const std::wstring& record, int order);
+    /// Applies the change of "Modified Selected Records" (NEdit_Global_Edit::GetValues) to
+    /// `record`; 1 for a record of a type it concerns, else 0.
+    int UpdateRecord(std::wstring& record, int mask, const std::wstring& values) const;
+    /// The instrument commands of the document; null before the rows are loaded.
+    UInstrumentCommands* GetInstrumentCommands() const { return Instruments.get(); }
 
     /// Imports a neutral file into the document, replacing its rows (the user has agreed).
     bool ImportNeutralFile(const QString& path);
@@ -162,7 +168,18 @@ class CNeditViewPane : public QWidget {
     void OnNeditDelAdjpts();
     void OnDisplaySettings();
     void OnEditRecordData(const QString& text, int row);
+    void NeditGlobalEdit();
+    void OnSetcomm();
     void OnObjectInfo(const PlanPick& pick);
+
+    // What the instrument commands do to the window (UTransferView).
+    void BlockMouse(bool block) override;
+    void ClearForm() override;
+    void ShowNewData() override;
+    int Transfer(bool download, const std::function<int()>& transfer) override;
+    int Reduction(const std::function<int()>& reduce) override;
+    /// The download, with its own window of progress and abort.
+    int RunDownload(const std::function<int()>& transfer);
 
     void BuildLayout();
     void WireList();
@@ -197,6 +214,7 @@ class CNeditViewPane : public QWidget {
     RowEditRecorder* Recorder;
     ListEventFan Events;
     std::unique_ptr<QtClipboard> Clipboard;
+    std::unique_ptr<UInstrumentCommands> Instruments;
     FileChooser ChooseFile;
 };
 

@@ -12,6 +12,8 @@
 #include "document/UListCtrl.h"
 #include "document/UNeditDoc.h"
 #include "document/URawDataContainer.h"
+#include "instruments/PortStores.h"
+#include "instruments/USetComm.h"
 #include "platform/messages/Translate.h"
 #include "platform/settings/IniFile.h"
 #include "platform/storage/UStreamFile.h"
@@ -24,16 +26,20 @@
 #include "ui/CommandTable.h"
 #include "ui/FindRecordDialog.h"
 #include "ui/QtDialogHost.h"
+#include "ui/QtProgressSink.h"
 #include "ui/RecordListModel.h"
 #include "ui/RowEditRecorder.h"
 #include "ui/UNeditDlgView.h"
 #include "ui/UNeditGraphView.h"
 #include "ui/UNeditView.h"
 #include "ui/UReportView.h"
+#include "ui/dialogs/FileUnits.h"
+#include "ui/dialogs/NEdit_Global_Edit.h"
 #include "ui/dialogs/ObjectInfoDialogs.h"
 #include "ui/dialogs/UDisplaySettingsDlg.h"
 #include "ui/dialogs/UEditRecordDlg.h"
 #include "ui/dialogs/UGetNameDlg.h"
+#include "ui/forms/DownloadProgressWindow.h"
 
 namespace nedit {
 
@@ -129,6 +135,21 @@ bool CNeditViewPane::OnCommand(int id) {
         case cmd::AbortProcess:
         case cmd::AbortProcessing:
             Document->SetAbortProcess(true);
+            break;
+        case cmd::GlobalEdit:
+            NeditGlobalEdit();
+            break;
+        case cmd::ImportRawfile:
+            Instruments->OnImportRawfile();
+            break;
+        case cmd::Download:
+            Instruments->OnNeditDownload();
+            break;
+        case cmd::DownloadAbort:
+            Instruments->OnNeditDownloadAbort();
+            break;
+        case cmd::Setcomm:
+            OnSetcomm();
             break;
         case cmd::Regenerate:
             OnNeditRegenerate();
@@ -366,12 +387,106 @@ void CNeditViewPane::OnNeditDelAdjpts() {
 }
 
 void CNeditViewPane::OnEditRecordData(const QString& text, int row) {
-    UEditRecordDlg dialog;
+    const FileUnits units =
+        FileUnits::AtRow(*Document, &Document->GetSettings(), ListCtrl->GetRows(), row);
+    UEditRecordDlg dialog(*Document, &Document->GetSettings(), units);
     if (!dialog.LoadRecord(text.toStdWString())) return;
-    if (Host->Run(dialog) != mb::IdOk) return;
+    if (Host->Run(dialog) != mb::IdOk || dialog.Fields.empty()) return;
     RowEditStep step(Recorder, tr("Edit Record Data"));
     if (ListCtrl->SetRecord(row, dialog.GetRecordText()) >= 0)
         ListCtrl->ShowRecord(ListCtrl->GetItemText(row), row);
+}
+
+int CNeditViewPane::UpdateRecord(std::wstring& record, int mask, const std::wstring& values) const {
+    return NEdit_Global_Edit::UpdateRecord(record, Document->GetRecordType(record), mask, values);
+}
+
+void CNeditViewPane::NeditGlobalEdit() {
+    const std::vector<int> rows = ListCtrl->GetSelectedRows();
+    if (rows.empty()) return;
+    int mask = 0;
+    for (const int row : rows) {
+        mask |= NEdit_Global_Edit::MaskOf(Document->GetRecordType(ListCtrl->GetItemText(row)));
+        if (mask == (NEdit_Global_Edit::kStationRows | NEdit_Global_Edit::kTargetRows)) break;
+    }
+    NEdit_Global_Edit dialog(mask, Document->GetSettings().GetLengthUnit());
+    if (Host->Run(dialog) != mb::IdOk) return;
+    std::wstring values;
+    if (dialog.GetValues(values) == 0) return;
+    // Heights go into each row in the unit its file is kept in there.
+    FileUnits units = FileUnits::OfJob(&Document->GetSettings());
+    int next = 0;
+    for (const int row : rows) {
+        for (; next < row; ++next) {
+            const std::wstring& text = ListCtrl->GetRows()[static_cast<std::size_t>(next)];
+            units.Take(text, Document->GetRecordType(text));
+        }
+        std::wstring record = ListCtrl->GetItemText(row);
+        const int changes = dialog.GetValues(values, units.length);
+        if (UpdateRecord(record, changes, values) != 0) ListCtrl->SetRecord(row, record);
+    }
+    DlgView->SetModified();
+    ListCtrl->ShowRecord(ListCtrl->GetItemText(rows.back()), rows.back());
+}
+
+void CNeditViewPane::OnSetcomm() {
+    Instruments->StopDownload();
+    USetComm dialog(Host);
+    Host->Run(dialog);
+}
+
+// ---- Instruments ---------------------------------------------------------------------------
+
+void CNeditViewPane::BlockMouse(bool block) {
+    GraphView->SetMouseClickFlag(!block);
+}
+
+void CNeditViewPane::ClearForm() {
+    DlgView->ClearFields();
+}
+
+void CNeditViewPane::ShowNewData() {
+    GraphView->ResetSelectedLine();
+    GraphView->ResetExtents();
+}
+
+int CNeditViewPane::Transfer(bool download, const std::function<int()>& transfer) {
+    // Rows arrive one by one; the form is not rebuilt for each of them.
+    ListCtrl->SetRecordForm(nullptr);
+    int result = 0;
+    if (download) {
+        result = RunDownload(transfer);
+    } else {
+        RecordListModel* model = ListView->Model();
+        model->BeginBulkChange();
+        result = RunLong(tr("Importing"), transfer);
+        model->EndBulkChange();
+    }
+    ListCtrl->SetRecordForm(DlgView);
+    return result;
+}
+
+int CNeditViewPane::RunDownload(const std::function<int()>& transfer) {
+    const InstrumentProfile::Current current = InstrumentProfile().ReadCurrent();
+    const QString source =
+        QStringLiteral("%1 on %2 (%3)")
+            .arg(QString::fromStdWString(current.instrument), QString::fromStdWString(current.comm),
+                 QString::fromStdString(PortsStore().DevicePath(current.comm)));
+    DownloadProgressWindow window(*ListCtrl, *Document->GetDeviceManager(), source, this);
+    Busy = true;
+    emit stateChanged();
+    Document->SetProgressSink(&window);
+    window.show();
+    const int result = transfer();
+    Document->SetProgressSink(Progress);
+    window.hide();
+    Busy = false;
+    emit stateChanged();
+    return result;
+}
+
+int CNeditViewPane::Reduction(const std::function<int()>& reduce) {
+    return Reduce(tr("Reducing"), reduce);
 }
 
 // ---- Views ---------------------------------------------------------------------------------

@@ -3,21 +3,23 @@
 #include <QMessageBox>
 #include <QPushButton>
 
-#include "reduction/UBKBCoordDlg.h"
-#include "reduction/UCoordEntryDlg.h"
-#include "report/UOutputParamDlg.h"
 #include "ui/dialogs/ObjectInfoDialogs.h"
 #include "ui/dialogs/UDisplaySettingsDlg.h"
-#include "ui/dialogs/UEditRecordDlg.h"
 #include "ui/dialogs/UGetNameDlg.h"
 #include "ui/forms/BackBearingForm.h"
 #include "ui/forms/CoordEntryForm.h"
 #include "ui/forms/DisplaySettingsForm.h"
+#include "ui/forms/DownloadForm.h"
 #include "ui/forms/EditRecordForm.h"
+#include "ui/forms/FileDialogForm.h"
 #include "ui/forms/GenericForm.h"
 #include "ui/forms/GetNameForm.h"
+#include "ui/forms/GlobalEditForm.h"
+#include "ui/forms/LoadRawForm.h"
 #include "ui/forms/ObjectInfoForm.h"
+#include "ui/forms/PortSettingsForm.h"
 #include "ui/forms/ReportParametersForm.h"
+#include "ui/forms/UploadSelectionForm.h"
 
 namespace nedit {
 
@@ -67,23 +69,32 @@ QMessageBox::Icon IconOf(unsigned flags) {
 }  // namespace
 
 QtDialogHost::QtDialogHost(QWidget* parent) : parent_(parent) {
-    SetFace<UCoordEntryDlg>(
-        [this](UCoordEntryDlg& dialog) { return ShowForm<CoordEntryForm>(dialog); });
-    SetFace<UBKBCoordDlg>([this](UBKBCoordDlg& dialog) {
-        BackBearingForm form(dialog, settings_, parent_);
-        return Exec(form);
-    });
-    SetFace<UOutputParamDlg>(
-        [this](UOutputParamDlg& dialog) { return ShowForm<ReportParametersForm>(dialog); });
-    SetFace<UDisplaySettingsDlg>(
-        [this](UDisplaySettingsDlg& dialog) { return ShowForm<DisplaySettingsForm>(dialog); });
+    SetForm<CoordEntryForm, UCoordEntryDlg>();
+    SetForm<BackBearingForm, UBKBCoordDlg>();
+    SetForm<ReportParametersForm, UOutputParamDlg>();
+    SetForm<DisplaySettingsForm, UDisplaySettingsDlg>();
     // A point, a line and an arc are shown in one form, each with what is known of it.
-    SetFace<POINTDLG>([this](POINTDLG& dialog) { return ShowForm<ObjectInfoForm>(dialog); });
-    SetFace<LINEDLG>([this](LINEDLG& dialog) { return ShowForm<ObjectInfoForm>(dialog); });
-    SetFace<ARCDLG>([this](ARCDLG& dialog) { return ShowForm<ObjectInfoForm>(dialog); });
-    SetFace<UGetNameDlg>([this](UGetNameDlg& dialog) { return ShowForm<GetNameForm>(dialog); });
-    SetFace<UEditRecordDlg>(
-        [this](UEditRecordDlg& dialog) { return ShowForm<EditRecordForm>(dialog); });
+    SetForm<ObjectInfoForm, POINTDLG>();
+    SetForm<ObjectInfoForm, LINEDLG>();
+    SetForm<ObjectInfoForm, ARCDLG>();
+    SetForm<GetNameForm, UGetNameDlg>();
+    SetForm<EditRecordForm, UEditRecordDlg>();
+    SetForm<GlobalEditForm, NEdit_Global_Edit>();
+    SetForm<DownloadForm, UNEDownload>();
+    SetForm<PortSettingsForm, USetComm>();
+    SetForm<UploadSelectionForm, UUploadSource>();
+    // The raw file dialog ends with the button that ended it.
+    SetFace<ULoadRawDlg>([this](ULoadRawDlg& dialog) {
+        return ShowForm<LoadRawForm>(dialog) == mb::IdOk ? dialog.GetEndCode() : mb::IdCancel;
+    });
+    SetFace<UFileDialog>([this](UFileDialog& dialog) {
+        FileDialogForm form(dialog, parent_);
+        if (unattended_) {
+            dialog.OnCancel();
+            return mb::IdCancel;
+        }
+        return ExecForm(form) == QDialog::Accepted ? mb::IdOk : mb::IdCancel;
+    });
 }
 
 QtDialogHost::~QtDialogHost() = default;

@@ -2,29 +2,24 @@
 // The desktop's DialogHost: message boxes as modal Qt message boxes with the system's
 // buttons and icons, and every dialog logic object in a modal form bound to it. A dialog
 // that has no form of its own yet is shown in a generic form that says so and accepts the
-// logic object's defaults with OK.
+// logic object's defaults with OK. Forms show lengths and angles in the units of the job
+// whose document is active, and say their refusals through this host.
 //
 // Forms and message boxes are shown through ExecForm and ExecMessage, which tests override
 // to answer without a screen.
 
 #include <QString>
+#include <type_traits>
 
 #include "platform/messages/DialogHost.h"
+#include "ui/forms/LogicForm.h"
 
 class QDialog;
 class QMessageBox;
 class QWidget;
-class UBKBCoordDlg;
-class UCoordEntryDlg;
 class UJobSettings;
-class UOutputParamDlg;
 
 namespace nedit {
-
-class UDisplaySettingsDlg;
-class UEditRecordDlg;
-class UGetNameDlg;
-class UObjectInfoDlg;
 
 class QtDialogHost : public DialogHost {
   public:
@@ -61,8 +56,18 @@ class QtDialogHost : public DialogHost {
     int Exec(QDialog& form);
     template <typename Form, typename Dialog>
     int ShowForm(Dialog& dialog) {
-        Form form(dialog, parent_);
-        return Exec(form);
+        if constexpr (std::is_constructible_v<Form, Dialog&, const FormContext&, QWidget*>) {
+            Form form(dialog, FormContext{settings_, this}, parent_);
+            return Exec(form);
+        } else {
+            Form form(dialog, parent_);
+            return Exec(form);
+        }
+    }
+    /// Shows dialogs of type `Dialog` in forms of type `Form` from now on.
+    template <typename Form, typename Dialog>
+    void SetForm() {
+        SetFace<Dialog>([this](Dialog& dialog) { return ShowForm<Form>(dialog); });
     }
 
     QWidget* parent_;

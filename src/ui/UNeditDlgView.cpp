@@ -1,19 +1,48 @@
 #include "ui/UNeditDlgView.h"
 
+#include <QEvent>
 #include <QFontDatabase>
 #include <QGridLayout>
 #include <QHBoxLayout>
+#include <QKeyEvent>
 #include <QLabel>
-#include <QLineEdit>
+#include <algorithm>
 
 #include "document/UListCtrl.h"
-#include "ui/RecordFields.h"
+#include "document/UNeditDoc.h"
+#include "platform/units/Units.h"
 #include "ui/RowEditRecorder.h"
+#include "ui/forms/UEdit.h"
 
 namespace nedit {
 
 namespace {
-constexpr int kFieldsPerLine = 6;
+
+constexpr int kFieldsPerLine = 8;
+constexpr int kFieldWidthInDigits = 10;
+
+UEdit::Kind EditKindOf(int kind) {
+    switch (kind) {
+        case 1:
+        case 2:
+            return UEdit::Kind::Long;
+        case URecordDlg::kRealNumber:
+            return UEdit::Kind::Double;
+        case URecordDlg::kAngle:
+            return UEdit::Kind::Angle;
+        default:
+            return UEdit::Kind::Text;
+    }
+}
+
+/// What fields a record needs: its label, and the caption and kind of each field.
+std::wstring LayoutOf(const URecordDlg& dialog) {
+    std::wstring layout = dialog.GetLabel();
+    for (const URecordDlg::EDITFLDPTR& field : dialog.GetFields())
+        layout += L'|' + field.Caption + L':' + std::to_wstring(field.Kind);
+    return layout;
+}
+
 }  // namespace
 
 UNeditDlgView::UNeditDlgView(QWidget* parent)
@@ -28,65 +57,149 @@ UNeditDlgView::UNeditDlgView(QWidget* parent)
     label_->setMinimumWidth(label_->fontMetrics().horizontalAdvance(QStringLiteral("TARGETHT2")));
     label_->setAlignment(Qt::AlignLeft | Qt::AlignTop);
     layout->addWidget(label_);
-    grid_->setHorizontalSpacing(6);
-    grid_->setVerticalSpacing(4);
+    grid_->setHorizontalSpacing(8);
+    grid_->setVerticalSpacing(2);
+    grid_->setAlignment(Qt::AlignTop);
     layout->addLayout(grid_, 1);
 }
 
+UNeditDlgView::~UNeditDlgView() = default;
+
+void UNeditDlgView::SetDoc(UNeditDoc* doc) {
+    RemoveFields();
+    dialog_.reset();
+    if (doc == nullptr) return;
+    dialog_ = std::make_unique<URecordDlg>(*doc);
+    dialog_->SetDoc(doc);
+    dialog_->SetList(list_);
+}
+
+void UNeditDlgView::SetList(UListCtrl* list) {
+    list_ = list;
+    if (dialog_) dialog_->SetList(list);
+}
+
+void UNeditDlgView::SetAngType(int type) {
+    if (dialog_) dialog_->SetAngType(type);
+}
+
+void UNeditDlgView::SetModified() {
+    if (dialog_) dialog_->SetModified();
+}
+
+bool UNeditDlgView::GetModifiedFlag() const {
+    return dialog_ && dialog_->GetModifiedFlag() != 0;
+}
+
+void UNeditDlgView::ClearModified() {
+    if (dialog_) dialog_->ClearModified();
+}
+
+int UNeditDlgView::Row() const {
+    return dialog_ ? dialog_->GetRow() : -1;
+}
+
 void UNeditDlgView::ClearFields() {
-    for (QLabel* name : names_) delete name;
-    for (QLineEdit* edit : edits_) delete edit;
-    names_.clear();
+    if (dialog_) dialog_->ClearFields();
+    RemoveFields();
+}
+
+void UNeditDlgView::RemoveFields() {
+    for (QLabel* caption : captions_) delete caption;
+    for (UEdit* edit : edits_) delete edit;
+    captions_.clear();
     edits_.clear();
-    field_names_.clear();
-    key_.clear();
+    layout_.clear();
     label_->clear();
-    row_ = -1;
 }
 
 int UNeditDlgView::ShowRecord(const std::wstring& text, int row) {
-    const RecordFields record = RecordFields::Split(text);
-    ClearFields();
-    if (record.key.empty()) return 0;
-    row_ = row;
-    key_ = record.key;
-    label_->setText(QString::fromStdWString(record.key));
-    const QFont fixed = QFontDatabase::systemFont(QFontDatabase::FixedFont);
-    int index = 0;
-    for (const RecordFields::Field& field : record.fields) {
-        auto* name = new QLabel(
-            field.name.empty() ? QStringLiteral("Value") : QString::fromStdWString(field.name),
-            this);
-        auto* edit = new QLineEdit(QString::fromStdWString(field.value), this);
-        edit->setFont(fixed);
-        edit->setMinimumWidth(edit->fontMetrics().horizontalAdvance(QLatin1Char('0')) * 10);
-        connect(edit, &QLineEdit::textEdited, this, &UNeditDlgView::FieldEdited);
-        const int line = index / kFieldsPerLine;
-        const int column = (index % kFieldsPerLine) * 2;
-        grid_->addWidget(name, line, column, Qt::AlignRight);
-        grid_->addWidget(edit, line, column + 1);
-        names_.push_back(name);
-        edits_.push_back(edit);
-        field_names_.push_back(field.name);
-        ++index;
-    }
-    return record.fields.empty() ? 0 : 1;
+    if (!dialog_) return 0;
+    const int shown = dialog_->ShowRecord(text, row);
+    ShowFields();
+    return shown;
 }
 
-void UNeditDlgView::FieldEdited() {
-    if (list_ == nullptr || row_ < 0) return;
-    RecordFields record;
-    record.key = key_;
-    for (std::size_t i = 0; i < edits_.size(); ++i)
-        record.fields.push_back({field_names_[i], edits_[i]->text().toStdWString()});
+void UNeditDlgView::ShowFields() {
+    const std::vector<URecordDlg::EDITFLDPTR>& fields = dialog_->GetFields();
+    const AngleUnit angles = AngleUnitFromIndex(dialog_->GetAngType());
+    const std::wstring layout = LayoutOf(*dialog_);
+    if (fields.empty() || layout != layout_) {
+        RemoveFields();
+        if (fields.empty()) return;
+        layout_ = layout;
+        label_->setText(QString::fromStdWString(dialog_->GetLabel()));
+        const QFont fixed = QFontDatabase::systemFont(QFontDatabase::FixedFont);
+        // A line shown whole takes the width of the form.
+        const int span = dialog_->GetLabel().empty() ? kFieldsPerLine : 1;
+        for (std::size_t i = 0; i < fields.size(); ++i) {
+            auto* caption = new QLabel(QString::fromStdWString(fields[i].Caption), this);
+            auto* edit = new UEdit(EditKindOf(fields[i].Kind), nullptr, this);
+            edit->setFont(fixed);
+            edit->setMinimumWidth(edit->fontMetrics().horizontalAdvance(QLatin1Char('0')) *
+                                  kFieldWidthInDigits);
+            edit->setReadOnly(!fields[i].Linked);
+            edit->installEventFilter(this);
+            const int index = static_cast<int>(i);
+            connect(edit, &QLineEdit::textEdited, this, [this, index] { FieldEdited(index); });
+            const int line = index / kFieldsPerLine * 2;
+            const int column = index % kFieldsPerLine;
+            grid_->addWidget(caption, line, column, 1, span, Qt::AlignLeft | Qt::AlignBottom);
+            grid_->addWidget(edit, line + 1, column, 1, span);
+            captions_.push_back(caption);
+            edits_.push_back(edit);
+        }
+        // The fields share the width of the form between them.
+        const int used = std::min(static_cast<int>(fields.size()) * span, kFieldsPerLine);
+        for (int column = 0; column < kFieldsPerLine; ++column)
+            grid_->setColumnStretch(column, column < used ? 1 : 0);
+    }
+    for (std::size_t i = 0; i < fields.size(); ++i) {
+        edits_[i]->SetAngleUnit(angles);
+        edits_[i]->setText(QString::fromStdWString(fields[i].Value));
+        edits_[i]->setCursorPosition(0);
+    }
+}
+
+void UNeditDlgView::FieldEdited(int index) {
+    if (!dialog_ || index >= static_cast<int>(edits_.size())) return;
     RowEditStep step(recorder_, tr("Typing"), true);
-    if (list_->SetRecord(row_, record.Join()) >= 0) SetModified();
+    dialog_->OnFieldChanged(index, edits_[static_cast<std::size_t>(index)]->text().toStdWString());
+    // A unit record typed in changes the unit the angle fields show.
+    const AngleUnit angles = AngleUnitFromIndex(dialog_->GetAngType());
+    for (UEdit* edit : edits_) edit->SetAngleUnit(angles);
+}
+
+bool UNeditDlgView::eventFilter(QObject* watched, QEvent* event) {
+    if (event->type() != QEvent::KeyPress) return QWidget::eventFilter(watched, event);
+    const auto* key = static_cast<QKeyEvent*>(event);
+    const auto found = std::find(edits_.begin(), edits_.end(), watched);
+    if (found == edits_.end()) return QWidget::eventFilter(watched, event);
+    if (key->key() == Qt::Key_Return || key->key() == Qt::Key_Enter) {
+        emit listFocusWanted();
+        return true;
+    }
+    if (key->key() == Qt::Key_Escape) {
+        const int index = static_cast<int>(found - edits_.begin());
+        if (!(*found)->isReadOnly()) {
+            (*found)->setText(QString::fromStdWString(dialog_->RememberedText(index)));
+            FieldEdited(index);
+        }
+        return true;
+    }
+    return QWidget::eventFilter(watched, event);
 }
 
 QLineEdit* UNeditDlgView::FieldEdit(int index) const {
     return index >= 0 && index < static_cast<int>(edits_.size())
                ? edits_[static_cast<std::size_t>(index)]
                : nullptr;
+}
+
+QString UNeditDlgView::FieldCaption(int index) const {
+    return index >= 0 && index < static_cast<int>(captions_.size())
+               ? captions_[static_cast<std::size_t>(index)]->text()
+               : QString();
 }
 
 QString UNeditDlgView::RecordLabel() const {

@@ -7,15 +7,16 @@
 #include <QLineEdit>
 #include <QPushButton>
 #include <QToolButton>
+#include <cmath>
 
-#include "ui/forms/NumberField.h"
+#include "ui/forms/UEdit.h"
 
 namespace nedit {
 
 ZoomPointBar::ZoomPointBar(QWidget* parent)
     : QFrame(parent),
       number_(new QLineEdit(this)),
-      scale_(new NumberField(this)),
+      scale_(new UEdit(UEdit::Kind::Double, nullptr, this)),
       lock_(new QCheckBox(QStringLiteral("Lock"), this)) {
     setObjectName(QStringLiteral("ZoomPointBar"));
     setFrameShape(QFrame::StyledPanel);
@@ -51,7 +52,7 @@ ZoomPointBar::ZoomPointBar(QWidget* parent)
 
 void ZoomPointBar::Start(const QString& number, double scale) {
     SetNumber(number);
-    scale_->SetValue(scale, 0);
+    scale_->SetValue(std::round(scale));
     lock_->setChecked(false);
     show();
     raise();

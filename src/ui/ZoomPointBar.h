@@ -10,7 +10,7 @@ class QLineEdit;
 
 namespace nedit {
 
-class NumberField;
+class UEdit;
 
 class ZoomPointBar : public QFrame {
     Q_OBJECT
@@ -36,7 +36,7 @@ class ZoomPointBar : public QFrame {
     void Finish();
 
     QLineEdit* number_;
-    NumberField* scale_;
+    UEdit* scale_;
     QCheckBox* lock_;
 };
 

@@ -55,8 +55,8 @@ void CommandTableTest::menuTexts_data() {
     row(cmd::FileOpen, "File", "Open...", true);
     row(cmd::FileSaveAs, "File", "Save Data As...", true);
     row(cmd::Transfer, "File", "Save To Survey", false);
-    row(cmd::Download, "File", "Download Raw Data...", false);
-    row(cmd::ImportRawfile, "File", "Import Raw Data File...", false);
+    row(cmd::Download, "File", "Download Raw Data...", true);
+    row(cmd::ImportRawfile, "File", "Import Raw Data File...", true);
     row(cmd::ImportNeutral, "File", "Import Neutral File...", true);
     row(cmd::ExportNeutral, "File", "Export Neutral File...", true);
     row(cmd::FilePrint, "File", "Print...", true);
@@ -66,7 +66,7 @@ void CommandTableTest::menuTexts_data() {
     row(cmd::NextRecord, "Edit", "Next", true);
     row(cmd::PreRecord, "Edit", "Previous", true);
     row(cmd::CommentRecord, "Edit", "Comment/Uncomment", true);
-    row(cmd::GlobalEdit, "Edit", "Edit Selected Records", false);
+    row(cmd::GlobalEdit, "Edit", "Edit Selected Records", true);
     row(cmd::OutputParam, "Edit", "Report Parameters", true);
     row(cmd::InsAtmos, "Insert/Header Record", "Temperature & Pressure", true);
     row(cmd::InsBkb, "Insert/Station Record", "Back Sight Station", true);
@@ -78,6 +78,7 @@ void CommandTableTest::menuTexts_data() {
     row(cmd::ActivateSurveyView, "View", "Survey", false);
     row(cmd::Traverse, "Tools", "Traverse Adjustment", false);
     row(cmd::DelAdjpts, "Tools", "Delete Adjusted Pts", true);
+    row(cmd::Setcomm, "Tools", "Port Settings...", true);
     row(cmd::SurveyCode, "Library", "Survey Codes", false);
     row(cmd::SurveyCodeSettings, "Library", "Code Settings", false);
 }

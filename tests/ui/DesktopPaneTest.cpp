@@ -30,6 +30,7 @@
 #include "ui/UNeditView.h"
 #include "ui/UReportView.h"
 #include "ui/forms/EditRecordForm.h"
+#include "ui/forms/UEdit.h"
 
 using namespace nedit;
 using nedit::test::ExampleWindow;

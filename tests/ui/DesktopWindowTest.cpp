@@ -118,9 +118,16 @@ void DesktopWindowTest::commandsAreEnabledByTheirRules() {
     QVERIFY(window.IsCommandEnabled(cmd::InsPt));
     QVERIFY(!window.IsCommandEnabled(cmd::AbortProcess));
     QVERIFY(!window.IsCommandEnabled(cmd::Undo));
+    QVERIFY(window.IsCommandEnabled(cmd::Download));
+    QVERIFY(window.IsCommandEnabled(cmd::ImportRawfile));
+    QVERIFY(window.IsCommandEnabled(cmd::Setcomm));
+    // Edit Selected Records wants rows to work on.
+    example.List().ClearSelection();
+    QVERIFY(!window.IsCommandEnabled(cmd::GlobalEdit));
+    example.List().SelectRow(3);
+    QVERIFY(window.IsCommandEnabled(cmd::GlobalEdit));
     // Not built: shown, disabled, and the tip says why.
-    for (const int id : {cmd::Transfer, cmd::Traverse, cmd::Download, cmd::ImportRawfile,
-                         cmd::GlobalEdit, cmd::SurveyCode}) {
+    for (const int id : {cmd::Transfer, cmd::Traverse, cmd::SurveyCode}) {
         QAction* action = window.Actions().Action(id);
         QVERIFY(action != nullptr);
         QVERIFY(!action->isEnabled());

@@ -17,12 +17,12 @@
 #include "report/UOutputParamDlg.h"
 #include "ui/dialogs/ObjectInfoDialogs.h"
 #include "ui/dialogs/UDisplaySettingsDlg.h"
-#include "ui/dialogs/UEditRecordDlg.h"
 #include "ui/dialogs/UGetNameDlg.h"
 #include "ui/forms/BackBearingForm.h"
 #include "ui/forms/CoordEntryForm.h"
-#include "ui/forms/NumberField.h"
 #include "ui/forms/ReportParametersForm.h"
+#include "ui/forms/UDlgMaker.h"
+#include "ui/forms/UEdit.h"
 
 using namespace nedit;
 using nedit::test::ScriptedHost;
@@ -51,10 +51,10 @@ class DialogsTest : public QObject {
     void arcDialogGivesTheArcsMeasures();
     void pointDialogPutsNorthingFirstForOrderOne();
     void documentNamesAreChecked();
-    void recordDialogSplitsAndJoinsFields();
     void messageBoxesAnswerWithTheirButtons();
     void coordinateFormTakesTypedValues();
     void coordinateFormWithFixedCheckHidesApplyToAll();
+    void coordinateFormWalksTheJobsCoordinateOrder();
     void backBearingFormReadsTheJobsAngleUnit();
     void reportParametersFormStoresTheColumns();
     void aDialogWithoutAFormTakesItsDefaults();
@@ -148,19 +148,6 @@ void DialogsTest::documentNamesAreChecked() {
     QVERIFY(!save.OnOK());
 }
 
-void DialogsTest::recordDialogSplitsAndJoinsFields() {
-    UEditRecordDlg dialog;
-    QVERIFY(dialog.LoadRecord(L"SS        ID=P1,HA=72.46454,CO=FC01"));
-    QCOMPARE(static_cast<int>(dialog.Record.fields.size()), 3);
-    QCOMPARE(dialog.Record.fields[1].name, std::wstring(L"HA"));
-    dialog.Record.fields[2].value = L"FENCE";
-    QCOMPARE(dialog.GetRecordText(), std::wstring(L"SS ID=P1,HA=72.46454,CO=FENCE"));
-    QVERIFY(dialog.LoadRecord(L"SCALE     0.99960"));
-    QCOMPARE(dialog.Record.fields.front().name, std::wstring());
-    QCOMPARE(dialog.GetRecordText(), std::wstring(L"SCALE 0.99960"));
-    QVERIFY(!dialog.LoadRecord(L"# a comment"));
-}
-
 void DialogsTest::messageBoxesAnswerWithTheirButtons() {
     ScriptedHost host;
     // Without an answer the default button decides: the second of Yes, No.
@@ -203,7 +190,7 @@ void DialogsTest::coordinateFormTakesTypedValues() {
 void DialogsTest::coordinateFormWithFixedCheckHidesApplyToAll() {
     UCoordEntryDlg dialog(UCoordEntryDlg::kNorthFirstId, nullptr);
     dialog.SetHasFixedPointCheck();
-    CoordEntryForm form(dialog, nullptr);
+    CoordEntryForm form(dialog, {}, nullptr);
     QVERIFY(form.ApplyToAllBox() == nullptr);
     const QList<QCheckBox*> boxes = form.findChildren<QCheckBox*>();
     QCOMPARE(boxes.size(), 1);
@@ -214,10 +201,45 @@ void DialogsTest::coordinateFormWithFixedCheckHidesApplyToAll() {
     QCOMPARE(dialog.getEast(), 0.0);
 }
 
+void DialogsTest::coordinateFormWalksTheJobsCoordinateOrder() {
+    UJobSettings feet;
+    feet.SetLengthUnit(LengthUnit::Feet);
+    UCoordEntryDlg dialog(UCoordEntryDlg::kNorthFirstId, nullptr);
+    dialog.InitXYZSvy(10.0, 20.0, UWPoint::kNoHeight, L"");
+    CoordEntryForm form(dialog, {&feet, nullptr}, nullptr);
+    // The job's point is offered and chosen: the typed row waits for its radio.
+    QVERIFY(form.SourceButton(UCoordEntryDlg::Source::Database)->isChecked());
+    QVERIFY(!form.EnteredField(0)->isEnabled());
+    QCOMPARE(form.Field(UCoordEntryDlg::Source::Database, 1)->text(), QStringLiteral("20.000"));
+    QCOMPARE(form.Field(UCoordEntryDlg::Source::Database, 2)->text(), QString());  // no height
+    QCOMPARE(form.EnteredField(0)->Unit(), QStringLiteral("ft"));
+    form.SourceButton(UCoordEntryDlg::Source::Enter)->setChecked(true);
+    QCOMPARE(dialog.GetSelectedSource(), UCoordEntryDlg::Source::Enter);
+    QVERIFY(form.EnteredField(0)->isEnabled());
+    // Northing first: Tab goes from the northing to the easting, then to the height.
+    const auto next = [](QWidget* widget) {
+        do {
+            widget = widget->nextInFocusChain();
+        } while (!(widget->focusPolicy() & Qt::TabFocus) || !widget->isEnabled());
+        return widget;
+    };
+    QCOMPARE(next(form.EnteredField(1)), form.EnteredField(0));
+    QCOMPARE(next(form.EnteredField(0)), form.EnteredField(2));
+    // Typed values go to the dialog at once; values the dialog is given show when told.
+    form.EnteredField(1)->setText(QStringLiteral("2000.5"));
+    QCOMPARE(dialog.RowOf(UCoordEntryDlg::Source::Enter).North, 2000.5);
+    dialog.InitXYZ(1.0, 2.0, 3.0, L"");
+    form.Maker().UpdateData(false);
+    QCOMPARE(form.EnteredField(2)->text(), QStringLiteral("3.000"));
+    form.accept();
+    QCOMPARE(dialog.getZ(), 3.0);
+    QCOMPARE(dialog.GetChosenSource(), UCoordEntryDlg::Source::Enter);
+}
+
 void DialogsTest::backBearingFormReadsTheJobsAngleUnit() {
     UJobSettings settings;  // ddd.mmss
     UBKBCoordDlg dialog(L"D");
-    BackBearingForm form(dialog, &settings, nullptr);
+    BackBearingForm form(dialog, {&settings, nullptr}, nullptr);
     QVERIFY(!form.BearingField()->isEnabled());
     form.ApplyBearingBox()->setChecked(true);
     QVERIFY(form.BearingField()->isEnabled());
@@ -232,7 +254,7 @@ void DialogsTest::reportParametersFormStoresTheColumns() {
     OutParamStruct parameters;
     parameters.AngularUnit = 2;
     UOutputParamDlg dialog(parameters);
-    ReportParametersForm form(dialog, nullptr);
+    ReportParametersForm form(dialog, {}, nullptr);
     const QList<QRadioButton*> radios = form.findChildren<QRadioButton*>();
     QVERIFY(radios.at(2)->isChecked());  // "Gon"
     form.ColumnBox(opt::LN)->setChecked(false);

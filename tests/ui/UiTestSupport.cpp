@@ -1,5 +1,7 @@
 #include "UiTestSupport.h"
 
+#include <QCheckBox>
+#include <QComboBox>
 #include <QDialog>
 #include <QFile>
 #include <QMessageBox>
@@ -10,6 +12,7 @@
 #include "ui/CNeditViewPane.h"
 #include "ui/UNeditGraphView.h"
 #include "ui/UNeditView.h"
+#include "ui/forms/DownloadForm.h"
 
 namespace nedit::test {
 
@@ -19,6 +22,12 @@ ConfigDirectory::ConfigDirectory() {
 
 QString ExampleFile() {
     return QStringLiteral(SXNEDIT_EXAMPLES "/boundary.neu");
+}
+
+void ChooseGsiOnCom1(DownloadForm& form) {
+    form.List(UNEDownload::kInstrumentList)->setCurrentText(QStringLiteral("Leica GSI"));
+    form.List(UNEDownload::kPortList)->setCurrentText(QStringLiteral("COM1"));
+    form.SaveRawBox()->setChecked(false);
 }
 
 int ScriptedHost::ExecForm(QDialog& form) {

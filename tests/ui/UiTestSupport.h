@@ -20,6 +20,7 @@ class QMessageBox;
 
 namespace nedit {
 class CNeditViewPane;
+class DownloadForm;
 class UNeditGraphView;
 }  // namespace nedit
 
@@ -39,6 +40,9 @@ class ConfigDirectory {
 
 /// The bundled example survey.
 QString ExampleFile();
+
+/// Fills "Download Parameters" for a fake instrument on COM1: Leica GSI, no raw file kept.
+void ChooseGsiOnCom1(DownloadForm& form);
 
 /// A host that shows nothing: message boxes take queued answers (else their default
 /// button), forms are filled by a script for their dialog name (else accepted as they are).

@@ -1,39 +1,37 @@
 #pragma once
 // "Back Bearing": the back station's coordinates, or, with "Apply Bearing" ticked, the
-// bearing to it, typed in the job's angle unit. OK only.
+// bearing to it. Coordinates show in the job's length unit and its coordinate order, the
+// bearing in its angle unit. OK only.
 
 #include "reduction/UBKBCoordDlg.h"
 #include "ui/forms/LogicForm.h"
 
 class QCheckBox;
-class UJobSettings;
 
 namespace nedit {
 
-class NumberField;
+class UEdit;
 
 class BackBearingForm : public LogicForm {
     Q_OBJECT
   public:
-    /// `settings` give the angle unit of the bearing; without them ddd.mmss.
-    BackBearingForm(UBKBCoordDlg& dialog, const UJobSettings* settings, QWidget* parent);
+    BackBearingForm(UBKBCoordDlg& dialog, const FormContext& context, QWidget* parent);
 
     QCheckBox* ApplyBearingBox() const { return apply_bearing_; }
-    NumberField* BearingField() const { return bearing_; }
-
-  protected:
-    void Store() override;
+    UEdit* EastField() const { return east_; }
+    UEdit* NorthField() const { return north_; }
+    UEdit* HeightField() const { return height_; }
+    UEdit* BearingField() const { return bearing_; }
 
   private:
     void UpdateEditable();
 
     UBKBCoordDlg& dialog_;
-    const UJobSettings* settings_;
-    NumberField* east_;
-    NumberField* north_;
-    NumberField* height_;
-    NumberField* bearing_;
-    QCheckBox* apply_bearing_;
+    UEdit* east_ = nullptr;
+    UEdit* north_ = nullptr;
+    UEdit* height_ = nullptr;
+    UEdit* bearing_ = nullptr;
+    QCheckBox* apply_bearing_ = nullptr;
 };
 
 }  // namespace nedit

@@ -2,39 +2,41 @@
 // "Control Point Coordinate": where a point's coordinates come from, the job, the field
 // records or values typed in. One row per source with a radio button; the typed row can
 // be edited only while its radio is on. Easting comes first or second as the dialog's
-// form (the job's coordinate order) says.
+// form (the job's coordinate order) says, and the cursor walks the columns in that order.
+// Coordinates show in the job's length unit.
 
 #include <array>
 
 #include "reduction/UCoordEntryDlg.h"
 #include "ui/forms/LogicForm.h"
 
+class QButtonGroup;
 class QCheckBox;
 class QRadioButton;
 
 namespace nedit {
 
-class NumberField;
+class UEdit;
 
 class CoordEntryForm : public LogicForm {
     Q_OBJECT
   public:
-    CoordEntryForm(UCoordEntryDlg& dialog, QWidget* parent);
+    CoordEntryForm(UCoordEntryDlg& dialog, const FormContext& context, QWidget* parent);
 
     QRadioButton* SourceButton(UCoordEntryDlg::Source source) const;
+    /// A field of a row: column 0 East, 1 North, 2 Height.
+    UEdit* Field(UCoordEntryDlg::Source source, int column) const;
     /// The fields of the typed row: East, North, Height.
-    NumberField* EnteredField(int column) const { return entered_[column]; }
+    UEdit* EnteredField(int column) const { return Field(UCoordEntryDlg::Source::Enter, column); }
     QCheckBox* ApplyToAllBox() const { return apply_all_; }
-
-  protected:
-    void Store() override;
+    QCheckBox* FixedBox() const { return fixed_; }
 
   private:
-    void Choose(UCoordEntryDlg::Source source);
+    void UpdateEditable();
 
     UCoordEntryDlg& dialog_;
-    std::array<QRadioButton*, 3> sources_{};
-    std::array<NumberField*, 3> entered_{};
+    QButtonGroup* sources_ = nullptr;
+    std::array<std::array<UEdit*, 3>, 3> fields_{};
     QCheckBox* apply_all_ = nullptr;
     QCheckBox* fixed_ = nullptr;
 };

@@ -1,11 +1,13 @@
 #include "ui/forms/ReportParametersForm.h"
 
+#include <QAbstractButton>
 #include <QButtonGroup>
 #include <QCheckBox>
 #include <QGridLayout>
 #include <QGroupBox>
-#include <QRadioButton>
 #include <QVBoxLayout>
+
+#include "ui/forms/UDlgMaker.h"
 
 namespace nedit {
 
@@ -33,45 +35,35 @@ constexpr Column kCoordinateColumns[] = {
     {opt::HC, "Elevation"},
 };
 
-QGroupBox* RadioGroup(const QString& title, const QStringList& texts, QButtonGroup* group,
-                      int checked, QWidget* parent) {
-    auto* box = new QGroupBox(title, parent);
-    auto* layout = new QVBoxLayout(box);
-    for (int i = 0; i < texts.size(); ++i) {
-        auto* radio = new QRadioButton(texts[i], box);
-        radio->setChecked(i == checked);
-        group->addButton(radio, i);
-        layout->addWidget(radio);
-    }
-    return box;
-}
-
 }  // namespace
 
-ReportParametersForm::ReportParametersForm(UOutputParamDlg& dialog, QWidget* parent)
-    : LogicForm(dialog, QStringLiteral("Report Parameters"), parent),
-      dialog_(dialog),
-      angular_(new QButtonGroup(this)),
-      linear_(new QButtonGroup(this)) {
+ReportParametersForm::ReportParametersForm(UOutputParamDlg& dialog, const FormContext& context,
+                                           QWidget* parent)
+    : LogicForm(dialog, QStringLiteral("Report Parameters"), parent, context), dialog_(dialog) {
     dialog_.OnInitDialog();
+    UDlgMaker& maker = Maker();
     auto* layout = new QVBoxLayout(this);
     auto* units = new QHBoxLayout();
-    units->addWidget(RadioGroup(
-        QStringLiteral("Angular  Output Units"),
-        {QStringLiteral("DDD MM SS"), QStringLiteral("Decimal Degree"), QStringLiteral("Gon")},
-        angular_, dialog_.AngularRadio, this));
-    units->addWidget(RadioGroup(QStringLiteral("Linear Output Units"),
-                                {QStringLiteral("Meters"), QStringLiteral("Feet")}, linear_,
-                                dialog_.LinearRadio, this));
+    angular_ = maker.Radio("RADIO,1,", dialog_.AngularRadio,
+                           {{0, QStringLiteral("DDD MM SS")},
+                            {1, QStringLiteral("Decimal Degree")},
+                            {2, QStringLiteral("Gon")}});
+    units->addWidget(UDlgMaker::RadioBox(QStringLiteral("Angular  Output Units"), angular_, this));
+    linear_ = maker.Radio("RADIO,1,", dialog_.LinearRadio,
+                          {{0, QStringLiteral("Meters")}, {1, QStringLiteral("Feet")}});
+    units->addWidget(UDlgMaker::RadioBox(QStringLiteral("Linear Output Units"), linear_, this));
     layout->addLayout(units);
-    auto add_columns = [this, layout](const QString& title, const auto& columns) {
+    auto add_columns = [this, layout, &maker](const QString& title, const auto& columns) {
         auto* box = new QGroupBox(title, this);
         auto* grid = new QGridLayout(box);
         int index = 0;
         for (const Column& column : columns) {
-            auto* check = new QCheckBox(QString::fromLatin1(column.text), box);
-            check->setChecked(dialog_.IsChecked(column.option));
-            columns_[column.option] = check;
+            const int option = column.option;
+            QCheckBox* check = maker.Check(
+                "CHECK,1", QString::fromLatin1(column.text),
+                [this, option] { return dialog_.IsChecked(option); },
+                [this, option](bool on) { dialog_.SetChecked(option, on); });
+            columns_[option] = check;
             grid->addWidget(check, index / 3, index % 3);
             ++index;
         }
@@ -80,12 +72,6 @@ ReportParametersForm::ReportParametersForm(UOutputParamDlg& dialog, QWidget* par
     add_columns(QStringLiteral("Measurement Output"), kMeasurementColumns);
     add_columns(QStringLiteral("Reduced Coordinates Output"), kCoordinateColumns);
     AddButtons(layout);
-}
-
-void ReportParametersForm::Store() {
-    dialog_.AngularRadio = angular_->checkedId();
-    dialog_.LinearRadio = linear_->checkedId();
-    for (const auto& [option, box] : columns_) dialog_.SetChecked(option, box->isChecked());
 }
 
 }  // namespace nedit

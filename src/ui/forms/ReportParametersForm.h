@@ -14,18 +14,17 @@ namespace nedit {
 class ReportParametersForm : public LogicForm {
     Q_OBJECT
   public:
-    ReportParametersForm(UOutputParamDlg& dialog, QWidget* parent);
+    ReportParametersForm(UOutputParamDlg& dialog, const FormContext& context, QWidget* parent);
 
     /// The box of a column, by its option id.
     QCheckBox* ColumnBox(int option) const { return columns_.at(option); }
-
-  protected:
-    void Store() override;
+    QButtonGroup* AngularGroup() const { return angular_; }
+    QButtonGroup* LinearGroup() const { return linear_; }
 
   private:
     UOutputParamDlg& dialog_;
-    QButtonGroup* angular_;
-    QButtonGroup* linear_;
+    QButtonGroup* angular_ = nullptr;
+    QButtonGroup* linear_ = nullptr;
     std::map<int, QCheckBox*> columns_;
 };
 
