@@ -51,7 +51,17 @@ bool JobCircles::SameString(long point, const std::wstring& command, const CodeG
     return false;
 }
 
-bool JobCircles::Takes(const UDBPoint& saved, const CodeGroup& first) {
+bool JobCircles::Takes(const UDBPoint& saved, const CodeGroup& first, const std::wstring& code) {
+    // The commands are read in the code the job keeps; a command that did not go into it
+    // opens no circle, and the user is told so.
+    for (const std::wstring* command : {&RadiusCommand, &CircumCommand}) {
+        if (Holds(code, *command) && !Holds(saved.GetCode(), *command)) {
+            Context.Leave(L"circle", saved.GetName(),
+                          Translate(L"the circle command {1} of its code is not in the job's "
+                                    L"point code (\"Include Commands\" is off)",
+                                    {*command}));
+        }
+    }
     bool hit = false;
     if (RadiusActive) {
         if (!RadiusPoints.empty() && SameString(RadiusPoints.front(), RadiusCommand, first))

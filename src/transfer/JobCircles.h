@@ -24,9 +24,10 @@ class JobCircles {
     /// `radiusCommand` and `circumCommand` are the keywords of the job's code settings.
     JobCircles(TransferContext& context, std::wstring radiusCommand, std::wstring circumCommand);
 
-    /// Whether the point just saved takes part in a circle (opening a command its code holds).
-    /// `first` is the first group of its code.
-    bool Takes(const UDBPoint& saved, const CodeGroup& first);
+    /// Whether the point just saved takes part in a circle (opening a command its code in the
+    /// job holds). `first` is the first group of its code; `code` the code it was reduced
+    /// with, whose circle commands, when the job's code lacks them, are named as lost.
+    bool Takes(const UDBPoint& saved, const CodeGroup& first, const std::wstring& code);
     /// Adds the point to the open commands; a command that has its points makes its circle in
     /// the job with the look of `code`, and closes.
     void Add(const UDBPoint& saved, const CodeGroup& first, const USvyCode& code);

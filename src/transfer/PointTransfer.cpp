@@ -182,7 +182,7 @@ PointTransfer::End PointTransfer::TransferPoint(std::size_t index) {
     if (!extras.empty() && !Working.SaveExtraSymbols(extras))
         Context.Leave(L"point", point.GetID(), Working.LastError());
 
-    const bool hit = Circles.Takes(Working, groups.front());
+    const bool hit = Circles.Takes(Working, groups.front(), point.GetCode());
     if (!Attach(point)) return End::Failed;
     if (hit) Circles.Add(Working, groups.front(), code);
     return End::Done;

@@ -102,6 +102,13 @@ class TransferTest : public ::testing::Test {
         auto query = job->Database().Query(std::string("SELECT count(*) FROM ") + table);
         return query->Step() ? static_cast<long>(query->Int(0)) : -1;
     }
+    /// The identifiers of a table's objects, in order.
+    std::vector<long> Ids(const char* table) {
+        std::vector<long> ids;
+        auto query = job->Database().Query(std::string("SELECT id FROM ") + table + " ORDER BY id");
+        while (query->Step()) ids.push_back(static_cast<long>(query->Int(0)));
+        return ids;
+    }
     /// The job's polylines of that name, in the order they were stored.
     std::vector<UDBPolyLine> Polylines(const std::wstring& name) {
         std::vector<UDBPolyLine> found;

@@ -3,12 +3,14 @@
 #include <CLI/CLI.hpp>
 #include <cstdio>
 #include <functional>
+#include <iterator>
 #include <map>
 #include <memory>
 #include <string>
 #include <vector>
 
 #include "Commands.h"
+#include "JobLinework.h"
 #include "PointOutput.h"
 #include "RunFiles.h"
 #include "platform/io/LineReader.h"
@@ -255,6 +257,22 @@ void AddJobCommands(CLI::App& app, CommandRun& run) {
     add("points", "list the job's points", [](const JobOptions& o) {
         return Points(o.job, o.json);
     })->add_flag("--json", options->json, "objects with id, e, n, h (null: no height) and code");
+    const std::pair<const char*, int (*)(const std::string&, bool)> listings[] = {
+        {"polylines", ListPolylines},
+        {"lines", ListLines},
+        {"arcs", ListArcs},
+        {"circles", ListCircles}};
+    const char* const listingHelp[] = {
+        "objects with name, layer, closed and vertices (id, e, n,\nh (null: no height), bulge)",
+        "objects with the two ends from and to (id, e, n, h) and\nthe layer",
+        "objects with start, end, centre, radius, sense and layer",
+        "objects with centre (id, e, n, h), radius and layer"};
+    for (std::size_t i = 0; i < std::size(listings); ++i) {
+        const auto list = listings[i].second;
+        add(listings[i].first, (std::string("list the job's ") + listings[i].first).c_str(),
+            [list](const JobOptions& o) { return list(o.job, o.json); })
+            ->add_flag("--json", options->json, listingHelp[i]);
+    }
     add("import-points",
         "add or update points from name,east,north,height,code\n"
         "rows (empty height: none; a later row of a name wins)",

@@ -1,0 +1,13 @@
+#pragma once
+// sxnedit job polylines|lines|arcs|circles: what the job holds besides its points, as a table
+// for people or as JSON for programs. A point is its name, East, North and height (null in
+// JSON, "-" in a table, when it has none).
+
+#include <string>
+
+/// Each prints the job's objects of its kind, in the order they were stored, and gives the
+/// exit status.
+int ListPolylines(const std::string& path, bool json);
+int ListLines(const std::string& path, bool json);
+int ListArcs(const std::string& path, bool json);
+int ListCircles(const std::string& path, bool json);
