@@ -6,6 +6,8 @@
 #include "reduction/UBKBCoordDlg.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "report/UOutputParamDlg.h"
+#include "transfer/LockedLayersQuestion.h"
+#include "transfer/LockedLayersQuestion.h"
 #include "ui/dialogs/ObjectInfoDialogs.h"
 #include "ui/dialogs/UDisplaySettingsDlg.h"
 #include "ui/dialogs/UEditRecordDlg.h"
@@ -84,6 +86,11 @@ QtDialogHost::QtDialogHost(QWidget* parent) : parent_(parent) {
     SetFace<UGetNameDlg>([this](UGetNameDlg& dialog) { return ShowForm<GetNameForm>(dialog); });
     SetFace<UEditRecordDlg>(
         [this](UEditRecordDlg& dialog) { return ShowForm<EditRecordForm>(dialog); });
+    // The locked layers before a transfer are a question with OK and Cancel.
+    SetFace<LockedLayersQuestion>([this](LockedLayersQuestion& question) {
+        const int answer = ShowMessage(question.GetMessage(), mb::OkCancel | mb::IconQuestion, 0);
+        return answer == mb::IdOk ? mb::IdOk : mb::IdCancel;
+    });
 }
 
 QtDialogHost::~QtDialogHost() = default;

@@ -119,8 +119,8 @@ void DesktopWindowTest::commandsAreEnabledByTheirRules() {
     QVERIFY(!window.IsCommandEnabled(cmd::AbortProcess));
     QVERIFY(!window.IsCommandEnabled(cmd::Undo));
     // Not built: shown, disabled, and the tip says why.
-    for (const int id : {cmd::Transfer, cmd::Traverse, cmd::Download, cmd::ImportRawfile,
-                         cmd::GlobalEdit, cmd::SurveyCode}) {
+    for (const int id :
+         {cmd::Traverse, cmd::Download, cmd::ImportRawfile, cmd::GlobalEdit, cmd::SurveyCode}) {
         QAction* action = window.Actions().Action(id);
         QVERIFY(action != nullptr);
         QVERIFY(!action->isEnabled());

@@ -160,6 +160,9 @@ class USurveyDoc : public UDocument {
 
     /// Reads the job's settings again from the file and updates all views.
     void Regen();
+    /// The hint of UpdateAllViews that asks the job's views to show all of the job, as after a
+    /// transfer into it.
+    static constexpr long kZoomAll = 1;
 
   private:
     const USvyCode* FindDefinition(std::wstring_view code, int& answer);
