@@ -2,8 +2,6 @@
 
 #include "platform/job/UDBArc.h"
 #include "platform/job/UDBLine.h"
-#include "platform/job/UDBPoint.h"
-#include "platform/job/USVSelectionList.h"
 #include "platform/job/USurveyDoc.h"
 #include "platform/messages/Translate.h"
 #include "platform/text/NumberText.h"
@@ -13,8 +11,6 @@ namespace nedit {
 
 namespace {
 
-// The display mask of the enumeration of lines and arcs at a point.
-constexpr unsigned kLineworkMask = 0x1500000;
 // A line or arc of the job has this bit of its flags cleared before it is saved.
 constexpr unsigned kClearedBit = 1;
 
@@ -149,38 +145,11 @@ bool LineworkTransfer::TransferArcs(long& n, StringMap& arcMap) {
 }
 
 long LineworkTransfer::GetUDBLine(long a, long b) {
-    if (a == 0) return 0;
-    USurveyDoc& job = Context.Job();
-    UDBPoint start(&job);
-    if (!start.Load(a)) return 0;
-    USVSelectionList found(&job);
-    job.EnumerateLines(nullptr, found, start.GetPoint(), nullptr, kLineworkMask);
-    UDBLine line(&job);
-    for (long id = found.First(); id != 0; id = found.Next()) {
-        if (ObjectKindOf(id) != kLineKind || !line.Load(id)) continue;
-        const long from = line.GetStartPointId();
-        const long to = line.GetEndPointId();
-        if ((from == a && to == b) || (from == b && to == a)) return id;
-    }
-    return 0;
+    return a == 0 ? 0 : Context.Job().GetLineBetween(a, b);
 }
 
 long LineworkTransfer::GetUDBArc(long a, long b, long third) {
-    if (a == 0) return 0;
-    USurveyDoc& job = Context.Job();
-    UDBPoint start(&job);
-    if (!start.Load(a)) return 0;
-    USVSelectionList found(&job);
-    job.EnumerateArcs(nullptr, found, start.GetPoint(), nullptr, kLineworkMask);
-    UDBArc arc(&job);
-    for (long id = found.First(); id != 0; id = found.Next()) {
-        if (ObjectKindOf(id) != kArcKind || !arc.Load(id)) continue;
-        const long from = arc.GetStartPointId();
-        const long to = arc.GetEndPointId();
-        if (((from == a && to == b) || (from == b && to == a)) && arc.GetThirdPointId() == third)
-            return id;
-    }
-    return 0;
+    return a == 0 ? 0 : Context.Job().GetArcOn(a, b, third);
 }
 
 }  // namespace nedit

@@ -32,7 +32,9 @@ class LineworkTransfer {
     bool TransferLines(long& n, StringMap& lineMap);
     bool TransferArcs(long& n, StringMap& arcMap);
 
-    /// The job's line between two of its points, in either direction; 0 when there is none.
+    /// The job's line between two of its points, in either direction (the first one, when the
+    /// job has several); 0 when there is none. Looked up by the two points, which finds what
+    /// the lines at the first point's position would give.
     long GetUDBLine(long a, long b);
     /// The job's arc with these ends, in either order, and this third point; 0 when none.
     long GetUDBArc(long a, long b, long third);

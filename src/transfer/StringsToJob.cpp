@@ -17,11 +17,6 @@ namespace {
 // The walk over the job's polylines takes them all with this rectangle and mask.
 constexpr unsigned kPolylineMask = 0x500000;
 
-UWPoint JobPosition(USurveyDoc& job, long id) {
-    const UDBPoint point(&job, id);
-    return point.GetPoint();
-}
-
 }  // namespace
 
 StringsToJob::StringsToJob(TransferContext& context, const std::vector<UNeditLine>& lines,
@@ -43,6 +38,12 @@ void StringsToJob::SaveStringsToJob(StringMap& lineMap, StringMap& arcMap, int n
     }
     lineMap.clear();
     arcMap.clear();
+}
+
+const UWPoint& StringsToJob::Position(long point) {
+    const auto known = Positions.find(point);
+    if (known != Positions.end()) return known->second;
+    return Positions.emplace(point, UDBPoint(&Context.Job(), point).GetPoint()).first->second;
 }
 
 void StringsToJob::ReadExistingStrings() {
@@ -222,8 +223,12 @@ StringsToJob::Step StringsToJob::AddArcVertices(UDBPolyLine& poly, const std::ws
     if (!threePoint) {
         type = arc.IsClockwise() ? type & ~UWArc::kAnticlockwise : type | UWArc::kAnticlockwise;
     }
-    USurveyDoc& job = Context.Job();
-    UWArc W(JobPosition(job, S), JobPosition(job, E), JobPosition(job, T), type);
+    const bool empty = poly.GetCount() == 0;
+    const int V = dir == 1 ? poly.GetCount() - 1 : 0;
+    const long X = empty ? 0 : poly.GetIdAt(V);
+    // An arc that meets neither end of the chain adds nothing.
+    if (!empty && X != S && X != E) return Step::Done;
+    UWArc W(Position(S), Position(E), Position(T), type);
     const UWPoint third = W.GetThird();
     UWArc first;
     UWArc second;
@@ -235,7 +240,7 @@ StringsToJob::Step StringsToJob::AddArcVertices(UDBPolyLine& poly, const std::ws
         return false;
     };
 
-    if (poly.GetCount() == 0) {
+    if (empty) {
         if (!threePoint) {
             poly.Add({W.GetBulgeFactor(), S});
             poly.Add({0.0, E});
@@ -248,9 +253,6 @@ StringsToJob::Step StringsToJob::AddArcVertices(UDBPolyLine& poly, const std::ws
         return Step::Done;
     }
 
-    const int V = dir == 1 ? poly.GetCount() - 1 : 0;
-    const long X = poly.GetIdAt(V);
-    if (X != S && X != E) return Step::Done;
     // The arc must run away from the tail, or towards the head.
     if ((dir == 0 && X == S) || (dir == 1 && X == E)) W = ReversedArc(W);
     const long O = X == S ? E : S;

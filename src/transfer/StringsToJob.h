@@ -20,6 +20,7 @@
 
 #include <map>
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 #include "codes/UNeditArc.h"
@@ -59,11 +60,14 @@ class StringsToJob {
     bool JobPoints(const std::wstring& string, std::vector<std::wstring> names, int newNames,
                    std::vector<long>& ids);
     void ReadExistingStrings();
+    /// Where the job's point is; each point is read once.
+    const UWPoint& Position(long point);
 
     TransferContext& Context;
     const std::vector<UNeditLine>& Lines;
     const std::vector<UNeditArc>& Arcs;
     std::map<std::wstring, long> ExistingStrings;
+    std::unordered_map<long, UWPoint> Positions;
     int OverrideAnswer = 0;
     bool OverrideAll = false;
 };

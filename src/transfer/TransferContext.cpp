@@ -61,8 +61,13 @@ long TransferContext::GetLayerId(const USvyCode& code) {
     return id;
 }
 
-long TransferContext::PointId(const std::wstring& name) const {
-    return Survey.GetPointId(UPointNumber(name));
+long TransferContext::PointId(const std::wstring& name) {
+    if (!PointsFrozen) return Survey.GetPointId(UPointNumber(name));
+    const auto known = PointIds.find(name);
+    if (known != PointIds.end()) return known->second;
+    const long id = Survey.GetPointId(UPointNumber(name));
+    PointIds.emplace(name, id);
+    return id;
 }
 
 const std::wstring& TransferContext::GetNewPoint(const std::wstring& name) const {

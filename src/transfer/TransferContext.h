@@ -3,9 +3,10 @@
 // progress and abort flag, the code reader, the report, the names that points took in the job,
 // and the layers looked up so far.
 //
-// Decision: a layer's identifier is looked up (and the layer made, switched on and checked
-// for saving) once per run and then kept: within the run's transaction nothing but the run
-// changes the job's layers, so every later look-up would give the same answer.
+// Decisions: a layer's identifier is looked up (and the layer made, switched on and checked
+// for saving) once per run and then kept, and so is a point's identifier once the points are
+// written: within the run's transaction nothing but the run changes the job, so every later
+// look-up would give the same answer.
 
 #include <string>
 #include <unordered_map>
@@ -48,7 +49,10 @@ class TransferContext {
     const std::wstring& LayerProblem() const { return LastLayerProblem; }
 
     /// The identifier of the job's point of that exact name; 0 when there is none.
-    long PointId(const std::wstring& name) const;
+    long PointId(const std::wstring& name);
+    /// The points are written: from now on the run writes no point, so each name is looked
+    /// up in the job once and kept.
+    void FreezePoints() { PointsFrozen = true; }
     /// The name that the point `name` took in the job in this run, or `name`.
     const std::wstring& GetNewPoint(const std::wstring& name) const;
     void SetNewID(const std::wstring& id, const std::wstring& jobName);
@@ -76,6 +80,8 @@ class TransferContext {
     bool Aborted = false;
     long Total = 0;
     std::unordered_map<std::wstring, std::wstring> NewIDs;
+    bool PointsFrozen = false;
+    std::unordered_map<std::wstring, long> PointIds;
     std::unordered_map<std::wstring, long> Layers;
     std::unordered_map<std::wstring, std::wstring> LayerProblems;
     std::wstring LastLayerProblem;

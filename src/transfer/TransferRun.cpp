@@ -84,6 +84,7 @@ int TransferRun::Run(TransferContext& context, const TransferSource& source) {
         return TransferToJobFinal(context, 1);
     }
 
+    context.FreezePoints();
     USvyCodeLib* library = Job->GetSurveyCodeLibraryFromJob();
     if (library != nullptr && library->IsModified()) {
         Job->UpdatePropertyBar(2);
