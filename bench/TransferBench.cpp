@@ -14,6 +14,7 @@
 #include <string>
 #include <vector>
 
+#include "BenchJob.h"
 #include "codes/UNeditArc.h"
 #include "codes/UNeditLine.h"
 #include "codes/UNeditPt.h"
@@ -25,6 +26,9 @@
 #include "transfer/UOverridePolyDlg.h"
 
 namespace {
+
+using nedit::bench::RemoveJob;
+using nedit::bench::TempJobPath;
 
 constexpr int kVertices = 20;
 
@@ -91,17 +95,6 @@ struct Survey {
     }
 };
 
-std::string TempJobPath() {
-    char folder[] = "/tmp/sxnedit-bench-XXXXXX";
-    const char* made = mkdtemp(folder);
-    return std::string(made != nullptr ? made : "/tmp") + "/bench.job";
-}
-
-void RemoveJob(const std::string& path) {
-    std::remove(path.c_str());
-    rmdir(path.substr(0, path.rfind('/')).c_str());
-}
-
 std::unique_ptr<USurveyDoc> NewJob(const std::string& path) {
     USvyCodeLib codes;
     USvyCode kerb;
@@ -123,7 +116,8 @@ int Transfer(USurveyDoc& job, const Survey& survey) {
     BenchHost host;
     const nedit::PointCodeReader codes;
     nedit::TransferRun run(&job, &host, nullptr, codes);
-    const int result = run.TransferToJob({survey.points, survey.lines, survey.arcs, nullptr});
+    const int result =
+        run.TransferToJob({survey.points, survey.lines, survey.arcs, nullptr, L"BENCH"});
     const nedit::TransferReport& report = run.GetReport();
     if (result != 1 || !report.Left.empty() || !report.Kept) return 0;
     return report.PolylinesAdded + report.PolylinesReplaced;

@@ -26,9 +26,9 @@
 #include "report/NeditIni.h"
 #include "report/OutParamStruct.h"
 #include "report/ReportContext.h"
-#include "traverse/TraverseRoutes.h"
 #include "transfer/PointCodeReader.h"
 #include "transfer/TransferReport.h"
+#include "traverse/TraverseRoutes.h"
 
 class NamelessCoordinates;
 class UListCtrl;
@@ -102,8 +102,9 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     /// with its progress and abort flag. 0 without an engine or a job; else as
     /// nedit::TransferRun::TransferToJob.
     int TransferToJob();
-    /// The same for the stores of `engine`, which need not be the document's own.
-    int TransferToJob(const UNeditDatabase& engine);
+    /// The same for the stores of `engine`, which need not be the document's own; `source`
+    /// names them in the job's record of the transfer (empty: the document's name).
+    int TransferToJob(const UNeditDatabase& engine, const std::wstring& source = L"");
     /// What the last transfer wrote and left out.
     const nedit::TransferReport& GetTransferReport() const { return LastTransfer; }
     /// How point codes are read for the transfer; the reader must outlive the document.

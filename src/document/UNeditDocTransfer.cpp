@@ -9,12 +9,12 @@ int UNeditDoc::TransferToJob() {
     return TransferToJob(*Database);
 }
 
-int UNeditDoc::TransferToJob(const UNeditDatabase& engine) {
+int UNeditDoc::TransferToJob(const UNeditDatabase& engine, const std::wstring& source) {
     if (SurveyDoc == nullptr) return 0;
     nedit::TransferRun run(SurveyDoc, Host, Progress, *CodeReader);
-    const nedit::TransferSource source{engine.GetPointList(), engine.GetLineList(),
-                                       engine.GetArcList(), &engine.GetDbCoordNames()};
-    const int result = run.TransferToJob(source);
+    const int result =
+        run.TransferToJob({engine.GetPointList(), engine.GetLineList(), engine.GetArcList(),
+                           &engine.GetDbCoordNames(), source.empty() ? GetName() : source});
     LastTransfer = run.GetReport();
     return result;
 }

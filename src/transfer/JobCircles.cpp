@@ -24,14 +24,14 @@ constexpr int kCentreNames = 10000;
 
 JobCircles::JobCircles(TransferContext& context, std::wstring radiusCommand,
                        std::wstring circumCommand)
-    : Context(context),
-      RadiusCommand(std::move(radiusCommand)),
-      CircumCommand(std::move(circumCommand)) {}
+    : Context(context) {
+    Radius.Keyword = std::move(radiusCommand);
+    Circum.Keyword = std::move(circumCommand);
+}
 
 void JobCircles::ResetCircleData() {
-    RadiusActive = CircumActive = false;
-    RadiusPoints.clear();
-    CircumPoints.clear();
+    Radius.Reset();
+    Circum.Reset();
 }
 
 bool JobCircles::Holds(const std::wstring& code, const std::wstring& command) const {
@@ -54,38 +54,31 @@ bool JobCircles::SameString(long point, const std::wstring& command, const CodeG
 bool JobCircles::Takes(const UDBPoint& saved, const CodeGroup& first, const std::wstring& code) {
     // The commands are read in the code the job keeps; a command that did not go into it
     // opens no circle, and the user is told so.
-    for (const std::wstring* command : {&RadiusCommand, &CircumCommand}) {
-        if (Holds(code, *command) && !Holds(saved.GetCode(), *command)) {
+    bool hit = false;
+    for (Command* command : {&Radius, &Circum}) {
+        if (Holds(code, command->Keyword) && !Holds(saved.GetCode(), command->Keyword)) {
             Context.Leave(L"circle", saved.GetName(),
                           Translate(L"the circle command {1} of its code is not in the job's "
                                     L"point code (\"Include Commands\" is off)",
-                                    {*command}));
+                                    {command->Keyword}));
         }
-    }
-    bool hit = false;
-    if (RadiusActive) {
-        if (!RadiusPoints.empty() && SameString(RadiusPoints.front(), RadiusCommand, first))
+        if (command->Active) {
+            hit = hit || (!command->Points.empty() &&
+                          SameString(command->Points.front(), command->Keyword, first));
+        } else if (Holds(saved.GetCode(), command->Keyword)) {
+            command->Active = true;
             hit = true;
-    } else if (Holds(saved.GetCode(), RadiusCommand)) {
-        RadiusActive = true;
-        hit = true;
-    }
-    if (CircumActive) {
-        if (!CircumPoints.empty() && SameString(CircumPoints.front(), CircumCommand, first))
-            hit = true;
-    } else if (Holds(saved.GetCode(), CircumCommand)) {
-        CircumActive = true;
-        hit = true;
+        }
     }
     return hit;
 }
 
 void JobCircles::Add(const UDBPoint& saved, const CodeGroup& first, const USvyCode& code) {
-    if (RadiusActive) {
-        if (RadiusPoints.empty()) {
-            RadiusPoints.push_back(saved.GetId());
+    if (Radius.Active) {
+        if (Radius.Points.empty()) {
+            Radius.Points.push_back(saved.GetId());
         } else {
-            const UDBPoint centre(&Context.Job(), RadiusPoints.front());
+            const UDBPoint centre(&Context.Job(), Radius.Points.front());
             const double radius = centre.GetPoint().DistanceTo(saved.GetPoint());
             if (!Is_Zero(radius, false)) {
                 SaveCircle(centre.GetId(), radius, code, false, centre.GetName());
@@ -94,17 +87,16 @@ void JobCircles::Add(const UDBPoint& saved, const CodeGroup& first, const USvyCo
                     L"circle", centre.GetName(),
                     Translate(L"its rim point {1} lies on the centre", {saved.GetName()}));
             }
-            RadiusActive = false;
-            RadiusPoints.clear();
+            Radius.Reset();
         }
     }
-    if (CircumActive) {
-        if (CircumPoints.size() < 2) {
-            CircumPoints.push_back(saved.GetId());
+    if (Circum.Active) {
+        if (Circum.Points.size() < 2) {
+            Circum.Points.push_back(saved.GetId());
             return;
         }
-        const UDBPoint one(&Context.Job(), CircumPoints[0]);
-        const UDBPoint two(&Context.Job(), CircumPoints[1]);
+        const UDBPoint one(&Context.Job(), Circum.Points[0]);
+        const UDBPoint two(&Context.Job(), Circum.Points[1]);
         const UWCircle circle(saved.GetPoint(), one.GetPoint(), two.GetPoint());
         if (!Is_Zero(circle.GetRadius(), false)) {
             const long centre = SaveCentre(circle.GetCentre(), saved, first);
@@ -117,8 +109,7 @@ void JobCircles::Add(const UDBPoint& saved, const CodeGroup& first, const USvyCo
                           Translate(L"its points {1}, {2} and {3} lie on one line",
                                     {one.GetName(), two.GetName(), saved.GetName()}));
         }
-        CircumActive = false;
-        CircumPoints.clear();
+        Circum.Reset();
     }
 }
 

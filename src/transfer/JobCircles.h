@@ -48,13 +48,20 @@ class JobCircles {
     /// it cannot be saved.
     long SaveCentre(const UWPoint& at, const UDBPoint& rim, const CodeGroup& first);
 
+    /// One circle command: its keyword, whether it is open, and the points it has.
+    struct Command {
+        std::wstring Keyword;
+        bool Active = false;
+        std::vector<long> Points;
+        void Reset() {
+            Active = false;
+            Points.clear();
+        }
+    };
+
     TransferContext& Context;
-    std::wstring RadiusCommand;
-    std::wstring CircumCommand;
-    bool RadiusActive = false;
-    bool CircumActive = false;
-    std::vector<long> RadiusPoints;
-    std::vector<long> CircumPoints;
+    Command Radius;
+    Command Circum;
 };
 
 }  // namespace nedit

@@ -75,73 +75,82 @@ bool LineworkTransfer::StyleAndSave(UDBLinework& object, const USvyCode& code,
     return false;
 }
 
-bool LineworkTransfer::TransferLines(long& n, StringMap& lineMap) {
-    for (std::size_t index = 0; index < Lines.size(); ++index) {
+// What a line is to the walk over the linework.
+struct LineworkTransfer::LineShape {
+    using Item = UNeditLine;
+    using Object = UDBLine;
+    static constexpr const wchar_t* kKind = L"line";
+    static constexpr int kObjectKind = kLineKind;
+    static std::wstring Label(const std::wstring& names) { return Translate(L"Line {1}", {names}); }
+    static std::vector<std::wstring> Names(const UNeditLine& line) {
+        return {line.GetFromPt(), line.GetToPt()};
+    }
+    static void Place(UDBLine& object, const std::vector<long>& ids, const UNeditLine&) {
+        object.SetPoints(ids[0], ids[1]);
+    }
+};
+
+// What an arc is to it: three points and the arc's type.
+struct LineworkTransfer::ArcShape {
+    using Item = UNeditArc;
+    using Object = UDBArc;
+    static constexpr const wchar_t* kKind = L"arc";
+    static constexpr int kObjectKind = kArcKind;
+    static std::wstring Label(const std::wstring& names) { return Translate(L"Arc {1}", {names}); }
+    static std::vector<std::wstring> Names(const UNeditArc& arc) {
+        return {arc.GetStartPt(), arc.GetEndPt(), arc.GetThirdPt()};
+    }
+    static void Place(UDBArc& object, const std::vector<long>& ids, const UNeditArc& arc) {
+        object.SetPoints(ids[0], ids[1], ids[2]);
+        object.SetArcType(static_cast<int>(arc.GetArcType()));
+    }
+};
+
+template <class Shape>
+bool LineworkTransfer::TransferEach(long& n, const std::vector<typename Shape::Item>& items,
+                                    StringMap& strings, int& added, int& updated) {
+    for (std::size_t index = 0; index < items.size(); ++index) {
         ++n;
         if (Context.AbortRequested()) return true;
         Context.Progress(n);
-        const UNeditLine& line = Lines[index];
-        const USvyCode code = Context.SurveyCode(line.GetCode(), false, true);
-        if (code.IsString != 0 && !line.GetStringNo().empty()) {
-            lineMap[line.GetStringNo()].push_back(static_cast<int>(index));
+        const typename Shape::Item& item = items[index];
+        const USvyCode code = Context.SurveyCode(item.GetCode(), false, true);
+        if (code.IsString != 0 && !item.GetStringNo().empty()) {
+            strings[item.GetStringNo()].push_back(static_cast<int>(index));
             continue;
         }
+        const std::vector<std::wstring> names = Shape::Names(item);
         std::vector<long> ids;
-        if (!JobPoints(L"line", {line.GetFromPt(), line.GetToPt()}, ids)) continue;
-        const long existing = GetUDBLine(ids[0], ids[1]);
-        UDBLine object(&Context.Job());
-        const std::wstring name =
-            Translate(L"Line {1}", {Joined({line.GetFromPt(), line.GetToPt()})});
+        if (!JobPoints(Shape::kKind, names, ids)) continue;
+        const long existing =
+            ids.size() == 2 ? GetUDBLine(ids[0], ids[1]) : GetUDBArc(ids[0], ids[1], ids[2]);
+        typename Shape::Object object(&Context.Job());
+        const std::wstring label = Shape::Label(Joined(names));
         if (existing != 0) {
-            if (ObjectKindOf(existing) != kLineKind || !object.Load(existing)) {
+            if (ObjectKindOf(existing) != Shape::kObjectKind || !object.Load(existing)) {
                 Context.Tell(Translate(L"{1} could not be written to the job: the job's object "
-                                       L"between its points is no line.",
-                                       {name}),
+                                       L"on its points is of another kind.",
+                                       {label}),
                              mb::IconStop);
                 return false;
             }
         } else {
-            object.SetPoints(ids[0], ids[1]);
+            Shape::Place(object, ids, item);
         }
-        if (!StyleAndSave(object, code, name)) return false;
-        ++(existing != 0 ? Context.Report().LinesUpdated : Context.Report().LinesAdded);
+        if (!StyleAndSave(object, code, label)) return false;
+        ++(existing != 0 ? updated : added);
     }
     return true;
 }
 
+bool LineworkTransfer::TransferLines(long& n, StringMap& lineMap) {
+    TransferReport& report = Context.Report();
+    return TransferEach<LineShape>(n, Lines, lineMap, report.LinesAdded, report.LinesUpdated);
+}
+
 bool LineworkTransfer::TransferArcs(long& n, StringMap& arcMap) {
-    for (std::size_t index = 0; index < Arcs.size(); ++index) {
-        ++n;
-        if (Context.AbortRequested()) return true;
-        Context.Progress(n);
-        const UNeditArc& arc = Arcs[index];
-        const USvyCode code = Context.SurveyCode(arc.GetCode(), false, true);
-        if (code.IsString != 0 && !arc.GetStringNo().empty()) {
-            arcMap[arc.GetStringNo()].push_back(static_cast<int>(index));
-            continue;
-        }
-        std::vector<long> ids;
-        if (!JobPoints(L"arc", {arc.GetStartPt(), arc.GetEndPt(), arc.GetThirdPt()}, ids)) continue;
-        const long existing = GetUDBArc(ids[0], ids[1], ids[2]);
-        UDBArc object(&Context.Job());
-        const std::wstring name =
-            Translate(L"Arc {1}", {Joined({arc.GetStartPt(), arc.GetEndPt(), arc.GetThirdPt()})});
-        if (existing != 0) {
-            if (ObjectKindOf(existing) != kArcKind || !object.Load(existing)) {
-                Context.Tell(Translate(L"{1} could not be written to the job: the job's object "
-                                       L"on its points is no arc.",
-                                       {name}),
-                             mb::IconStop);
-                return false;
-            }
-        } else {
-            object.SetPoints(ids[0], ids[1], ids[2]);
-            object.SetArcType(static_cast<int>(arc.GetArcType()));
-        }
-        if (!StyleAndSave(object, code, name)) return false;
-        ++(existing != 0 ? Context.Report().ArcsUpdated : Context.Report().ArcsAdded);
-    }
-    return true;
+    TransferReport& report = Context.Report();
+    return TransferEach<ArcShape>(n, Arcs, arcMap, report.ArcsAdded, report.ArcsUpdated);
 }
 
 long LineworkTransfer::GetUDBLine(long a, long b) {

@@ -40,6 +40,12 @@ class LineworkTransfer {
     long GetUDBArc(long a, long b, long third);
 
   private:
+    struct LineShape;
+    struct ArcShape;
+    /// The walk over the lines or the arcs; `Shape` says what differs between the two.
+    template <class Shape>
+    bool TransferEach(long& n, const std::vector<typename Shape::Item>& items, StringMap& strings,
+                      int& added, int& updated);
     /// The job's identifiers of `names` (through the run's new names); false, after listing
     /// the object as not written, when one is missing or two are the same.
     bool JobPoints(const wchar_t* kind, const std::vector<std::wstring>& names,

@@ -257,31 +257,34 @@ bool PointTransfer::SavePoint(bool existing, int undoFlag) {
     return saved;
 }
 
+void PointTransfer::AttachmentFailed(const wchar_t* kind, const std::wstring& name,
+                                     const std::wstring& question, bool& goOn) {
+    Context.Leave(kind, name, Working.LastError());
+    if (AppMessageBox(Context.Host(), question, mb::YesNo | mb::IconQuestion) == mb::IdNo)
+        goOn = false;
+}
+
 bool PointTransfer::Attach(const UNeditPt& point) {
     const std::wstring& name = point.GetID();
     if (DoImages && point.GetImageSize() > 0) {
         if (Working.AttachImageFiles(point.GetImages(), false, L"")) {
             if (!SavePoint(true, 0)) return false;
         } else {
-            Context.Leave(L"images", name, Working.LastError());
-            const int answer = AppMessageBox(
-                Context.Host(),
+            AttachmentFailed(
+                L"images", name,
                 Translate(L"Images for point: {1} could not be loaded.  Load remaining images ?",
                           {name}),
-                mb::YesNo | mb::IconQuestion);
-            if (answer == mb::IdNo) DoImages = false;
+                DoImages);
         }
     }
     if (DoAttributes && !Working.GetCode().empty() &&
         !Working.AddAttributeObjectData(point.GetPointAttributes(), true, true, true) &&
         point.GetPointAttributeSize() > 0) {
-        Context.Leave(L"attributes", name, Working.LastError());
-        const int answer = AppMessageBox(
-            Context.Host(),
-            Translate(L"Attributes for point {1} could not be loaded.  Load remaining attributes ?",
-                      {name}),
-            mb::YesNo | mb::IconQuestion);
-        if (answer == mb::IdNo) DoAttributes = false;
+        AttachmentFailed(L"attributes", name,
+                         Translate(L"Attributes for point {1} could not be loaded.  Load "
+                                   L"remaining attributes ?",
+                                   {name}),
+                         DoAttributes);
     }
     if (DoNotes && !point.GetNote().empty()) {
         if (Working.SaveExtendedData(point.GetNote(), UDBObject::kNoteData)) {

@@ -65,6 +65,10 @@ class PointTransfer {
     /// Steps 19 to 21: images, attributes and the note of the saved point. False when the
     /// point cannot be saved again.
     bool Attach(const UNeditPt& point);
+    /// Names an attachment that would not go with the point, and asks whether to go on
+    /// with the others of its kind; No clears `goOn`.
+    void AttachmentFailed(const wchar_t* kind, const std::wstring& name,
+                          const std::wstring& question, bool& goOn);
     /// Shows why the run stops at this point.
     void Fail(const std::wstring& name, const std::wstring& reason);
 

@@ -17,6 +17,59 @@ namespace {
 // The walk over the job's polylines takes them all with this rectangle and mask.
 constexpr unsigned kPolylineMask = 0x500000;
 
+// The lines or the arcs of a string that its chain has not taken yet, tried in their order.
+// Those taken are marked as they go and leave the string's array when the string is done, so
+// a long string in order costs one try per piece, and the array keeps what is left for the
+// next time the string's name comes up.
+class Pieces {
+  public:
+    enum Tried { kFailed, kGrew, kNone };
+
+    explicit Pieces(std::vector<int>* indices)
+        : Indices(indices),
+          Taken(indices != nullptr ? indices->size() : 0, false),
+          Remaining(Taken.size()) {}
+    ~Pieces() {
+        if (Indices == nullptr) return;
+        std::size_t kept = 0;
+        for (std::size_t i = 0; i < Taken.size(); ++i) {
+            if (!Taken[i]) (*Indices)[kept++] = (*Indices)[i];
+        }
+        Indices->resize(kept);
+    }
+    Pieces(const Pieces&) = delete;
+    Pieces& operator=(const Pieces&) = delete;
+
+    std::size_t Left() const { return Remaining; }
+    /// The first piece not taken; only while some are left.
+    int First() const { return (*Indices)[Next]; }
+    void TakeFirst() { Take(Next); }
+    /// Tries the pieces not taken in order with `attach`, which gives kFailed, kGrew or kNone,
+    /// and takes the first that grew the chain. Gives what the last try gave.
+    template <class Attach>
+    Tried TakeFirstThat(Attach attach) {
+        for (std::size_t i = Next; i < Taken.size(); ++i) {
+            if (Taken[i]) continue;
+            const Tried tried = attach((*Indices)[i]);
+            if (tried == kGrew) Take(i);
+            if (tried != kNone) return tried;
+        }
+        return kNone;
+    }
+
+  private:
+    void Take(std::size_t i) {
+        Taken[i] = true;
+        --Remaining;
+        while (Next < Taken.size() && Taken[Next]) ++Next;
+    }
+
+    std::vector<int>* Indices;
+    std::vector<bool> Taken;
+    std::size_t Remaining;
+    std::size_t Next = 0;
+};
+
 }  // namespace
 
 StringsToJob::StringsToJob(TransferContext& context, const std::vector<UNeditLine>& lines,
@@ -57,36 +110,35 @@ void StringsToJob::ReadExistingStrings() {
 
 void StringsToJob::SaveString(const std::wstring& name, std::vector<int>* L, std::vector<int>* A,
                               int newNames) {
-    const bool haveLines = L != nullptr && !L->empty();
-    const bool haveArcs = A != nullptr && !A->empty();
-    if (!haveLines && !haveArcs) return;
+    Pieces lines(L);
+    Pieces arcs(A);
+    if (lines.Left() == 0 && arcs.Left() == 0) return;
     UDBPolyLine poly(&Context.Job());
     USvyCode code;
     // The seed: the first line of the string, else its first arc.
-    if (haveLines) {
-        code =
-            Context.SurveyCode(Lines[static_cast<std::size_t>(L->front())].GetCode(), false, true);
-        if (AddLineVertices(poly, name, L->front(), newNames) == Step::Failed) return;
-        L->erase(L->begin());
+    if (lines.Left() > 0) {
+        code = Context.SurveyCode(Lines[static_cast<std::size_t>(lines.First())].GetCode(), false,
+                                  true);
+        if (AddLineVertices(poly, name, lines.First(), newNames) == Step::Failed) return;
+        lines.TakeFirst();
     } else {
         code =
-            Context.SurveyCode(Arcs[static_cast<std::size_t>(A->front())].GetCode(), false, true);
-        if (AddArcVertices(poly, name, A->front(), newNames, 1) == Step::Failed) return;
-        A->erase(A->begin());
+            Context.SurveyCode(Arcs[static_cast<std::size_t>(arcs.First())].GetCode(), false, true);
+        if (AddArcVertices(poly, name, arcs.First(), newNames, 1) == Step::Failed) return;
+        arcs.TakeFirst();
     }
     if (poly.GetCount() == 0) return;
 
     int dir = 0;
     int idle = 0;
     int lastCount = 0;
-    auto left = [&] { return (L != nullptr ? L->size() : 0) + (A != nullptr ? A->size() : 0); };
-    while (left() > 0) {
+    while (lines.Left() + arcs.Left() > 0) {
         if (idle > 3) {
             Context.Leave(L"string", name,
                           Translate(L"{1} of its lines and arcs do not join its chain (a gap, a "
                                     L"second closing or a leg it shares with another string), so "
                                     L"none of it was saved",
-                                    {std::to_wstring(left())}));
+                                    {std::to_wstring(lines.Left() + arcs.Left())}));
             return;
         }
         dir = dir == 0 ? 1 : 0;
@@ -96,22 +148,20 @@ void StringsToJob::SaveString(const std::wstring& name, std::vector<int>* L, std
         } else {
             ++idle;
         }
-        for (std::size_t i = 0; L != nullptr && i < L->size(); ++i) {
-            const int before = poly.GetCount();
-            if (AddLineVertices(poly, name, (*L)[i], newNames) == Step::Failed) return;
-            if (poly.GetCount() > before) {
-                L->erase(L->begin() + static_cast<std::ptrdiff_t>(i));
-                break;
-            }
-        }
-        for (std::size_t i = 0; A != nullptr && i < A->size(); ++i) {
-            const int before = poly.GetCount();
-            if (AddArcVertices(poly, name, (*A)[i], newNames, dir) == Step::Failed) return;
-            if (poly.GetCount() > before) {
-                A->erase(A->begin() + static_cast<std::ptrdiff_t>(i));
-                break;
-            }
-        }
+        const bool attached =
+            lines.TakeFirstThat([&](int index) {
+                const int before = poly.GetCount();
+                if (AddLineVertices(poly, name, index, newNames) == Step::Failed)
+                    return Pieces::kFailed;
+                return poly.GetCount() > before ? Pieces::kGrew : Pieces::kNone;
+            }) != Pieces::kFailed &&
+            arcs.TakeFirstThat([&](int index) {
+                const int before = poly.GetCount();
+                if (AddArcVertices(poly, name, index, newNames, dir) == Step::Failed)
+                    return Pieces::kFailed;
+                return poly.GetCount() > before ? Pieces::kGrew : Pieces::kNone;
+            }) != Pieces::kFailed;
+        if (!attached) return;
     }
     if (poly.GetCount() < 2) {
         Context.Tell(Translate(L"String {1} could not be created because at least 2 vertices are "

@@ -9,15 +9,9 @@
 #include <string>
 #include <vector>
 
-namespace nedit {
+#include "platform/job/JobTransfers.h"
 
-/// An object that did not reach the job: its kind ("point", "line", "arc", "circle",
-/// "string", "images", "attributes", "note"), its name as the reduction knows it, and why.
-struct NotWritten {
-    std::wstring Kind;
-    std::wstring Name;
-    std::wstring Reason;
-};
+namespace nedit {
 
 /// A point stored under another name: the name of the reduction and the name in the job.
 struct RenamedPoint {

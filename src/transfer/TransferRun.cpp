@@ -3,6 +3,7 @@
 #include <unordered_set>
 
 #include "platform/job/JobError.h"
+#include "platform/job/JobTransfers.h"
 #include "platform/job/UDBSQLiteTransaction.h"
 #include "platform/job/USurveyDoc.h"
 #include "platform/messages/DialogHost.h"
@@ -31,6 +32,7 @@ int TransferRun::TransferToJob(const TransferSource& source) {
         TransferContext context(*Job, Host, Progress, Codes, Report);
         const int result = Run(context, source);
         if (Report.End == TransferEnd::Finished || Report.End == TransferEnd::Failed) {
+            RecordTransfer(Job->Database(), RecordOf(source.Name));
             transaction.Commit();
             Report.Kept = true;
         } else {
@@ -53,6 +55,19 @@ int TransferRun::TransferToJob(const TransferSource& source) {
         AppMessageBox(Host, Translate(L"Data Transfer Error !"), mb::Ok | mb::IconStop);
         return 0;
     }
+}
+
+TransferRecord TransferRun::RecordOf(const std::wstring& source) const {
+    TransferRecord record;
+    record.Source = source;
+    record.Points = Report.PointsAdded + Report.PointsUpdated;
+    record.Lines = Report.LinesAdded + Report.LinesUpdated;
+    record.Arcs = Report.ArcsAdded + Report.ArcsUpdated;
+    record.Circles = Report.Circles;
+    record.Polylines = Report.PolylinesAdded + Report.PolylinesReplaced;
+    record.Complete = Report.End == TransferEnd::Finished;
+    record.Left = Report.Left;
+    return record;
 }
 
 int TransferRun::Run(TransferContext& context, const TransferSource& source) {

@@ -17,7 +17,8 @@
 //   (a feature code is compared with the names of the job's layers, as it always was); the
 //   run finds them itself from the points it is given.
 // - Everything the rules leave out without a word, and every point locked in the job that is
-//   written over, is named in the report and, at the end of the run, in one message.
+//   written over, is named in the report and, at the end of the run, in one message. A run
+//   that is kept leaves its record in the job (JobTransfers.h), with what it left out.
 // - The reader of point codes is handed in: until the code grammar reads codes for the
 //   transfer, a code is one group, its whole text the feature code (PointCodeReader).
 
@@ -39,13 +40,15 @@ class PointCodeReader;
 class ProgressSink;
 class TransferContext;
 
-/// What a transfer reads: the stores of one reduction, and the names whose coordinates the
-/// user took from the job during it (null for none).
+/// What a transfer reads: the stores of one reduction, the names whose coordinates the user
+/// took from the job during it (null for none), and the name of the document or file they
+/// come from, which the job's record of the transfer keeps.
 struct TransferSource {
     const std::vector<UNeditPt>& Points;
     const std::vector<UNeditLine>& Lines;
     const std::vector<UNeditArc>& Arcs;
     const std::map<std::wstring, bool>* DbCoordNames = nullptr;
+    std::wstring Name;
 };
 
 class TransferRun {
@@ -66,6 +69,8 @@ class TransferRun {
     /// question's answer (1 for OK).
     int LockedLayersDlg(TransferContext& context, const std::vector<UNeditPt>& points);
     void UnLockedLayers();
+    /// The job's record of this run.
+    TransferRecord RecordOf(const std::wstring& source) const;
     /// The closing upkeep of the job; with `ok` 0 also "Data Transfer Error !". Gives `ok`.
     int TransferToJobFinal(TransferContext& context, int ok);
 

@@ -7,7 +7,6 @@
 #include "reduction/UCoordEntryDlg.h"
 #include "report/UOutputParamDlg.h"
 #include "transfer/LockedLayersQuestion.h"
-#include "transfer/LockedLayersQuestion.h"
 #include "ui/dialogs/ObjectInfoDialogs.h"
 #include "ui/dialogs/UDisplaySettingsDlg.h"
 #include "ui/dialogs/UEditRecordDlg.h"

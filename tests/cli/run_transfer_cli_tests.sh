@@ -65,6 +65,12 @@ check transfer-overwritten 0 "$here/expected/transfer-points.txt" "" -- "$sxnedi
 # A stored document, and the options a transfer refuses.
 "$sxnedit" doc import "$job" "$site" --name DAY1 >/dev/null
 check doc-transfer 0 "$(expected transfer-again.txt)" "" -- "$sxnedit" doc transfer "$job" DAY1
+# The job keeps a record of every transfer it kept, with what each left out.
+"$sxnedit" job transfers "$job" --json >"$work/transfers.json"
+[ "$(grep -c '"made_at"' "$work/transfers.json")" -eq 3 ] &&
+    grep -q '"source": "DAY1", "complete": true, "written": {"points": 3, "lines": 1' "$work/transfers.json" &&
+    grep -q '"name": "B", "reason": "the reduction took its coordinates from the job, which stand"' "$work/transfers.json" &&
+    passed=$((passed + 1)) || { echo "FAIL job-transfers"; cat "$work/transfers.json"; failed=$((failed + 1)); }
 check transfer-bad-answer 64 /dev/null "" -- "$sxnedit" transfer "$site" --job "$job" --existing keep
 check transfer-no-job 64 /dev/null "" -- "$sxnedit" transfer "$site"
 

@@ -33,6 +33,8 @@ TEST_F(PointTransferTest, NamesLoseLeadingBlanksAndZerosAndZerosOnlyStopTheRun) 
     EXPECT_EQ(Transfer(), 0);
     EXPECT_EQ(report.End, TransferEnd::Failed);
     EXPECT_TRUE(report.Kept);
+    ASSERT_EQ(ReadTransfers(job->Database()).size(), 1u);
+    EXPECT_FALSE(ReadTransfers(job->Database())[0].Complete);
     EXPECT_EQ(JobPointNamed(L"12").GetId(), twelve);
     EXPECT_EQ(JobPointNamed(L"7").GetX(), 7.0);
     EXPECT_EQ(JobPointNamed(L"P9").GetId(), 0);

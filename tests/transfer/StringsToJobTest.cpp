@@ -205,4 +205,45 @@ TEST_F(StringsToJobTest, LostStringsAreNamedWithTheirReason) {
     EXPECT_TRUE(
         Told(L"String KB06 could not be created because some vertices were not found "
              L"in the database."));
+    // The job keeps the record of the transfer, with what it left out.
+    const std::vector<TransferRecord> records = ReadTransfers(job->Database());
+    ASSERT_EQ(records.size(), 1u);
+    EXPECT_EQ(records[0].Source, L"SITE");
+    EXPECT_TRUE(records[0].Complete);
+    EXPECT_EQ(records[0].Points, 9);
+    EXPECT_EQ(records[0].Polylines, 0);
+    ASSERT_EQ(records[0].Left.size(), 3u);
+    EXPECT_EQ(records[0].Left[2].Reason, L"point Z9 is not in the job");
+    EXPECT_EQ(records[0].MadeAt.size(), 20u);  // 2026-11-23T17:13:15Z
+}
+
+// Awkward input: a string of 100,000 vertices, a three-point arc on a straight line (bulges 0),
+// a line of no length, and a layer name of 255 characters.
+TEST_F(StringsToJobTest, LongStraightAndEmptyStringsAndALongLayerName) {
+    constexpr int kLong = 100000;
+    points.reserve(kLong + 8);
+    for (int i = 0; i < kLong; ++i) Point(L"L" + std::to_wstring(i), i * 0.5, 0.0, 1.0);
+    for (std::size_t i = 1; i < kLong; ++i) Line(points[i - 1], points[i], L"KB", L"KB99");
+    Point(L"S", 0, 10, 1.0);
+    Point(L"T", 5, 10, 1.0);
+    Point(L"E", 10, 10, 1.0);
+    Arc(L"S", L"E", L"T", UWArc::kThirdOnArc, L"KB", L"KB98");
+    Point(L"Q1", 3, 3, 1.0);
+    Point(L"Q2", 3, 3, 1.0);
+    Line(L"Q1", L"Q2", L"LONG", L"KB97");
+    USvyCode longLayer = Code(L"LONG", std::wstring(255, L'L'), 1);
+    job->GetJobCodeLibrary()->SetSvyCode(longLayer);
+    ASSERT_EQ(Transfer(), 1);
+    ASSERT_EQ(Polylines(L"KB99").size(), 1u);
+    EXPECT_EQ(Polylines(L"KB99")[0].GetCount(), kLong);
+    const std::vector<UDBPolyLine> straight = Polylines(L"KB98");
+    ASSERT_EQ(straight.size(), 1u);
+    EXPECT_EQ(VertexNames(straight[0]), (std::vector<std::wstring>{L"S", L"T", L"E"}));
+    EXPECT_EQ(straight[0].GetAt(0).Bulge, 0.0);
+    EXPECT_EQ(straight[0].GetAt(1).Bulge, 0.0);
+    const std::vector<UDBPolyLine> empty = Polylines(L"KB97");
+    ASSERT_EQ(empty.size(), 1u);
+    EXPECT_EQ(empty[0].GetCount(), 2);
+    EXPECT_EQ(empty[0].GetLayer(), job->GetLayerId(std::wstring(255, L'L')));
+    EXPECT_TRUE(report.Left.empty());
 }

@@ -64,7 +64,11 @@ class TransferTest : public ::testing::Test {
     /// A line between two points of the store, of `code` in string `string` (none: empty).
     void Line(const std::wstring& from, const std::wstring& to, const std::wstring& code = L"",
               const std::wstring& string = L"") {
-        UNeditLine line(Find(from), Find(to));
+        Line(Find(from), Find(to), code, string);
+    }
+    void Line(const UNeditPt& from, const UNeditPt& to, const std::wstring& code,
+              const std::wstring& string) {
+        UNeditLine line(from, to);
         line.SetCode(code);
         line.SetStringNo(string);
         lines.push_back(line);
@@ -89,7 +93,7 @@ class TransferTest : public ::testing::Test {
 
     int Transfer() {
         TransferRun run(job.get(), &host, &progress, *reader);
-        const int result = run.TransferToJob({points, lines, arcs, &dbCoordNames});
+        const int result = run.TransferToJob({points, lines, arcs, &dbCoordNames, L"SITE"});
         report = run.GetReport();
         return result;
     }

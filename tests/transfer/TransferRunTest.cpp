@@ -181,12 +181,13 @@ TEST_F(TransferRunTest, AbortHalfWayLeavesTheJobAsItWas) {
         Line(L"P" + std::to_wstring(i - 1), L"P" + std::to_wstring(i), L"KB", L"KB01");
     AbortingProgress aborting(60);  // among the lines
     TransferRun run(job.get(), &host, &aborting, wholeCodes);
-    EXPECT_EQ(run.TransferToJob({points, lines, arcs, nullptr}), 1);
+    EXPECT_EQ(run.TransferToJob({points, lines, arcs, nullptr, L"SITE"}), 1);
     EXPECT_EQ(run.GetReport().End, TransferEnd::Aborted);
     EXPECT_EQ(run.GetReport().PointsAdded, 0);
     EXPECT_EQ(Count("point"), 1);
     EXPECT_EQ(Count("polyline"), 0);
     EXPECT_EQ(job->Database().TransactionDepth(), 0);
+    EXPECT_TRUE(ReadTransfers(job->Database()).empty());
     EXPECT_TRUE(Told(L"The transfer was aborted: the job is as it was before it."));
 }
 

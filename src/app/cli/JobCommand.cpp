@@ -10,7 +10,7 @@
 #include <vector>
 
 #include "Commands.h"
-#include "JobLinework.h"
+#include "JobListings.h"
 #include "PointOutput.h"
 #include "RunFiles.h"
 #include "platform/io/LineReader.h"
@@ -227,6 +227,7 @@ int Info(const std::string& path) {
     Print(nedit::Format(L"Layers:         %lld\n", Count(*job, "SELECT count(*) FROM layer")));
     Print(
         nedit::Format(L"Survey codes:   %lld\n", Count(*job, "SELECT count(*) FROM survey_code")));
+    Print(nedit::Format(L"Transfers:      %lld\n", Count(*job, "SELECT count(*) FROM transfer")));
     Print(nedit::Format(L"Raw-data files: %lld\n",
                         Count(*job, "SELECT count(*) FROM storage WHERE parent_id IS NOT NULL")));
     return exit_status::Ok;
@@ -261,12 +262,15 @@ void AddJobCommands(CLI::App& app, CommandRun& run) {
         {"polylines", ListPolylines},
         {"lines", ListLines},
         {"arcs", ListArcs},
-        {"circles", ListCircles}};
+        {"circles", ListCircles},
+        {"transfers", ListTransfers}};
     const char* const listingHelp[] = {
         "objects with name, layer, closed and vertices (id, e, n,\nh (null: no height), bulge)",
         "objects with the two ends from and to (id, e, n, h) and\nthe layer",
         "objects with start, end, centre, radius, sense and layer",
-        "objects with centre (id, e, n, h), radius and layer"};
+        "objects with centre (id, e, n, h), radius and layer",
+        "objects with made_at, source, complete, written (counts)\nand not_written (kind, name, "
+        "reason)"};
     for (std::size_t i = 0; i < std::size(listings); ++i) {
         const auto list = listings[i].second;
         add(listings[i].first, (std::string("list the job's ") + listings[i].first).c_str(),

@@ -200,14 +200,14 @@ void AddSurveyTransferOptions(CLI::App& command, SurveyTransferOptions& options)
 }
 
 int SaveToSurvey(UNeditDoc& doc, const UNeditDatabase& engine, ConsoleDialogHost& host,
-                 const SurveyTransferOptions& options) {
+                 const SurveyTransferOptions& options, const std::wstring& source) {
     USurveyDoc* job = doc.GetSurveyDoc();
     Answers answers(host, options);
     host.SetInteractive(options.interactive);
     host.SetEcho(false);
     const std::size_t said = host.Messages().size();
     UDBSQLiteTransaction transaction(job);
-    doc.TransferToJob(engine);
+    doc.TransferToJob(engine, source);
     TransferReport report = doc.GetTransferReport();
     const std::vector<std::string>& conflicts = answers.Conflicts();
     std::vector<std::wstring> messages(host.Messages().begin() + static_cast<std::ptrdiff_t>(said),

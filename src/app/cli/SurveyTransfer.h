@@ -30,7 +30,8 @@ struct SurveyTransferOptions {
 void AddSurveyTransferOptions(CLI::App& command, SurveyTransferOptions& options);
 
 /// Writes the stores of `engine` into the job of `doc`, answering through `host` as the
-/// options say, and prints what was written (a line of counts, or the JSON). The exit status:
-/// Ok when the run came to its end and was kept, else Failed.
+/// options say, and prints what was written (a line of counts, or the JSON). `source` names
+/// the survey in the job's record of the transfer (empty: the document's name). The exit
+/// status: Ok when the run came to its end and was kept, else Failed.
 int SaveToSurvey(UNeditDoc& doc, const UNeditDatabase& engine, ConsoleDialogHost& host,
-                 const SurveyTransferOptions& options);
+                 const SurveyTransferOptions& options, const std::wstring& source = L"");

@@ -9,6 +9,7 @@
 #include "RecordSession.h"
 #include "RunFiles.h"
 #include "SurveyTransfer.h"
+#include "platform/text/WideText.h"
 
 namespace {
 
@@ -33,7 +34,8 @@ int Transfer(const TransferCommandOptions& options) {
                      options.file.c_str());
         return exit_status::Failed;
     }
-    return SaveToSurvey(*session.doc, engine, session.host, options.transfer);
+    return SaveToSurvey(*session.doc, engine, session.host, options.transfer,
+                        nedit::FromUtf8(options.file));
 }
 
 }  // namespace

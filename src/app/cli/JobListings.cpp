@@ -1,4 +1,4 @@
-#include "JobLinework.h"
+#include "JobListings.h"
 
 #include <cstdio>
 #include <memory>
@@ -7,6 +7,7 @@
 #include "Commands.h"
 #include "JsonLayout.h"
 #include "platform/geometry/UWArc.h"
+#include "platform/job/JobTransfers.h"
 #include "platform/job/USurveyDoc.h"
 #include "platform/text/Format.h"
 #include "platform/text/WideText.h"
@@ -198,6 +199,41 @@ int ListCircles(const std::string& path, bool json) {
             text += PointText(centre, decimals) +
                     nedit::Format(L"  radius %.*f  %s\n", decimals, query->Real(4), query->Text(5));
         }
+    }
+    return json ? PrintJson(rows) : Print(text);
+}
+
+int ListTransfers(const std::string& path, bool json) {
+    auto job = OpenForReading(path);
+    std::vector<json::Value> rows;
+    std::wstring text;
+    for (const nedit::TransferRecord& record : nedit::ReadTransfers(job->Database())) {
+        if (json) {
+            json::Value left = json::Value::array();
+            for (const nedit::NotWritten& object : record.Left) {
+                left.push_back({{"kind", json::Text(object.Kind)},
+                                {"name", json::Text(object.Name)},
+                                {"reason", json::Text(object.Reason)}});
+            }
+            rows.push_back({{"made_at", json::Text(record.MadeAt)},
+                            {"source", json::Text(record.Source)},
+                            {"complete", record.Complete},
+                            {"written",
+                             {{"points", record.Points},
+                              {"lines", record.Lines},
+                              {"arcs", record.Arcs},
+                              {"circles", record.Circles},
+                              {"polylines", record.Polylines}}},
+                            {"not_written", left}});
+            continue;
+        }
+        text += nedit::Format(
+            L"%s %s%s: points %d, lines %d, arcs %d, circles %d, polylines %d, %d left out\n",
+            record.MadeAt, record.Source, record.Complete ? L"" : L" (stopped by a failure)",
+            record.Points, record.Lines, record.Arcs, record.Circles, record.Polylines,
+            static_cast<int>(record.Left.size()));
+        for (const nedit::NotWritten& object : record.Left)
+            text += L"  " + object.Kind + L" " + object.Name + L": " + object.Reason + L"\n";
     }
     return json ? PrintJson(rows) : Print(text);
 }
