@@ -19,6 +19,8 @@
 // - Everything the rules leave out without a word, and every point locked in the job that is
 //   written over, is named in the report and, at the end of the run, in one message. A run
 //   that is kept leaves its record in the job (JobTransfers.h), with what it left out.
+// - The user's choices for the point codes are asked as "Point Code" (UToSvyDlg) through the
+//   run's host, which stands for the job's own question about them.
 // - The reader of point codes is handed in: until the code grammar reads codes for the
 //   transfer, a code is one group, its whole text the feature code (PointCodeReader).
 

@@ -71,6 +71,11 @@ check doc-transfer 0 "$(expected transfer-again.txt)" "" -- "$sxnedit" doc trans
     grep -q '"source": "DAY1", "complete": true, "written": {"points": 3, "lines": 1' "$work/transfers.json" &&
     grep -q '"name": "B", "reason": "the reduction took its coordinates from the job, which stand"' "$work/transfers.json" &&
     passed=$((passed + 1)) || { echo "FAIL job-transfers"; cat "$work/transfers.json"; failed=$((failed + 1)); }
+cp "$job" "$work/readonly.job"
+chmod a-w "$work/readonly.job"
+check transfer-read-only 2 /dev/null \
+    "sxnedit: The job $work/readonly.job is read-only: it can be opened for reading only." -- \
+    "$sxnedit" transfer "$site" --job "$work/readonly.job"
 check transfer-bad-answer 64 /dev/null "" -- "$sxnedit" transfer "$site" --job "$job" --existing keep
 check transfer-no-job 64 /dev/null "" -- "$sxnedit" transfer "$site"
 
