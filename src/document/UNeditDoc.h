@@ -26,6 +26,8 @@
 #include "report/NeditIni.h"
 #include "report/OutParamStruct.h"
 #include "report/ReportContext.h"
+#include "transfer/PointCodeReader.h"
+#include "transfer/TransferReport.h"
 #include "traverse/TraverseRoutes.h"
 
 class NamelessCoordinates;
@@ -92,6 +94,23 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     UNeditDatabase* GetDatabase() const { return Database.get(); }
     /// The text of a new record of that type: its key and the fields of its layout.
     std::wstring FormRecBuf(int recordType) const;
+
+    // ---- Save To Survey (UNeditDocTransfer.cpp) ---------------------------------------------
+    // The transfer lies beside the engine, not beneath it, so the document hands it the
+    // engine's stores: the transfer reads the points, lines and arcs and never the rows.
+    /// The stores of the last reduction into the job, asking through the document's host,
+    /// with its progress and abort flag. 0 without an engine or a job; else as
+    /// nedit::TransferRun::TransferToJob.
+    int TransferToJob();
+    /// The same for the stores of `engine`, which need not be the document's own; `source`
+    /// names them in the job's record of the transfer (empty: the document's name).
+    int TransferToJob(const UNeditDatabase& engine, const std::wstring& source = L"");
+    /// What the last transfer wrote and left out.
+    const nedit::TransferReport& GetTransferReport() const { return LastTransfer; }
+    /// How point codes are read for the transfer; the reader must outlive the document.
+    void SetPointCodeReader(const nedit::PointCodeReader* reader) {
+        CodeReader = reader != nullptr ? reader : &WholeCodes;
+    }
 
     // ---- Report and its parameters ------------------------------------------------------------
     int CreateNReport();
@@ -207,6 +226,9 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     std::unique_ptr<UDeviceManager> DeviceManager;
     unsigned ImportMode = 0;
     std::chrono::milliseconds DownloadTimeOut = kDownloadTimeOut;
+    nedit::PointCodeReader WholeCodes;
+    const nedit::PointCodeReader* CodeReader = &WholeCodes;
+    nedit::TransferReport LastTransfer;
 
     std::vector<XInput*> InputStack;
     std::unique_ptr<XInputOption> Option;

@@ -171,6 +171,8 @@ class UNeditDatabase {
     /// 1 when the job has the point and it loads, with its values and code.
     int GetCoordFromSvyDoc(const std::wstring& name, double& e, double& n, double& z,
                            std::wstring& code) const;
+    /// The names for which the user took the job's coordinates in this run.
+    const std::map<std::wstring, bool>& GetDbCoordNames() const { return DbCoordNames; }
     /// The job has a point of that name (whether or not it loads).
     bool JobHasPoint(const std::wstring& name) const;
     /// Coordinates are shown Easting first: the job's setting, and so without a job.

@@ -164,6 +164,9 @@ class CNeditViewPane : public QWidget, private UTransferView {
     void OnCommentRecord();
     void OnNeditOutputparam();
     void OnNeditRegenerate();
+    /// "Save To Survey": regenerates first when the user wants the edited records, then
+    /// writes the stores into the job and tells the job's views to show all of it.
+    void OnNeditTransfer();
     void OnNeditViewReport();
     void OnNeditDelAdjpts();
     void OnDisplaySettings();

@@ -14,6 +14,7 @@
 #include "document/URawDataContainer.h"
 #include "instruments/PortStores.h"
 #include "instruments/USetComm.h"
+#include "platform/job/USurveyDoc.h"
 #include "platform/messages/Translate.h"
 #include "platform/settings/IniFile.h"
 #include "platform/storage/UStreamFile.h"
@@ -153,6 +154,9 @@ bool CNeditViewPane::OnCommand(int id) {
             break;
         case cmd::Regenerate:
             OnNeditRegenerate();
+            break;
+        case cmd::Transfer:
+            OnNeditTransfer();
             break;
         case cmd::ViewReport:
             OnNeditViewReport();
@@ -501,6 +505,18 @@ void CNeditViewPane::OnNeditRegenerate() {
         GraphView->ResetSelectedLine();
         GraphView->ResetExtents();
     }
+}
+
+void CNeditViewPane::OnNeditTransfer() {
+    const UNeditDatabase* engine = Document->GetDatabase();
+    if (engine != nullptr && engine->IsContentModified() &&
+        AppMessageBox(Host, Translate(L"Data has been edited. Regenerate before transferring?"),
+                      mb::YesNo | mb::IconQuestion) == mb::IdYes) {
+        OnNeditRegenerate();
+    }
+    if (RunLong(tr("Saving to the survey"), [this] { return Document->TransferToJob(); }) == 0)
+        return;
+    if (SurveyDocument != nullptr) SurveyDocument->UpdateAllViews(nullptr, USurveyDoc::kZoomAll);
 }
 
 void CNeditViewPane::OnNeditViewReport() {

@@ -3,6 +3,7 @@
 #include <QMessageBox>
 #include <QPushButton>
 
+#include "transfer/LockedLayersQuestion.h"
 #include "ui/dialogs/ObjectInfoDialogs.h"
 #include "ui/dialogs/UDisplaySettingsDlg.h"
 #include "ui/dialogs/UGetNameDlg.h"
@@ -94,6 +95,11 @@ QtDialogHost::QtDialogHost(QWidget* parent) : parent_(parent) {
             return mb::IdCancel;
         }
         return ExecForm(form) == QDialog::Accepted ? mb::IdOk : mb::IdCancel;
+    });
+    // The locked layers before a transfer are a question with OK and Cancel.
+    SetFace<LockedLayersQuestion>([this](LockedLayersQuestion& question) {
+        const int answer = ShowMessage(question.GetMessage(), mb::OkCancel | mb::IconQuestion, 0);
+        return answer == mb::IdOk ? mb::IdOk : mb::IdCancel;
     });
 }
 

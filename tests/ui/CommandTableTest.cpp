@@ -54,7 +54,7 @@ void CommandTableTest::menuTexts_data() {
     row(cmd::FileNew, "File", "New", true);
     row(cmd::FileOpen, "File", "Open...", true);
     row(cmd::FileSaveAs, "File", "Save Data As...", true);
-    row(cmd::Transfer, "File", "Save To Survey", false);
+    row(cmd::Transfer, "File", "Save To Survey", true);
     row(cmd::Download, "File", "Download Raw Data...", true);
     row(cmd::ImportRawfile, "File", "Import Raw Data File...", true);
     row(cmd::ImportNeutral, "File", "Import Neutral File...", true);

@@ -17,6 +17,7 @@
 #include "document/UListCtrl.h"
 #include "document/UNeditDoc.h"
 #include "document/URawDataContainer.h"
+#include "platform/job/USurveyDoc.h"
 #include "reduction/UNeditDatabase.h"
 #include "report/UNeditReport.h"
 #include "ui/CNeditViewPane.h"
@@ -76,6 +77,7 @@ class DesktopPaneTest : public QObject {
     void aDoubleClickedRowOpensItsRecordDialog();
     void aDoubleClickedPointShowsWhatIsKnownOfIt();
     void regenerateAsksAboutTheReportAndShowsIt();
+    void saveToSurveyWritesTheReducedSurveyIntoTheJob();
     void findSelectsTheNextMatchingRow();
     void exportWritesEveryRowAndImportReplacesThem();
     void saveAsKeepsWhatWasSavedUnderTheOldName();
@@ -285,6 +287,27 @@ void DesktopPaneTest::regenerateAsksAboutTheReportAndShowsIt() {
     const QString saved = example.WorkFile(QStringLiteral("report.txt"));
     QVERIFY(report->SaveAsText(saved));
     QVERIFY(QFileInfo(saved).size() > 100);
+}
+
+void DesktopPaneTest::saveToSurveyWritesTheReducedSurveyIntoTheJob() {
+    ExampleWindow example;
+    USurveyDoc* job = example.Pane().GetSurveyDoc();
+    QVERIFY(job != nullptr);
+    QVERIFY(example.Window().IsCommandEnabled(cmd::Transfer));
+    QVERIFY(example.Window().RunCommand(cmd::Transfer));
+    // The point code settings are asked, then the ten points and four station lines go in.
+    QCOMPARE(example.Host().FormsShown().back(), QStringLiteral("Point Code"));
+    auto count = [job](const char* table) {
+        auto query = job->Database().Query(std::string("SELECT count(*) FROM ") + table);
+        return query->Step() ? query->Int(0) : -1;
+    };
+    QCOMPARE(count("point"), 10);
+    QCOMPARE(count("line"), 4);
+    QCOMPARE(example.Pane().GetDocument()->GetTransferReport().End, TransferEnd::Finished);
+    // A second transfer finds every point equal and writes them again without a question.
+    QVERIFY(example.Window().RunCommand(cmd::Transfer));
+    QCOMPARE(count("point"), 10);
+    QCOMPARE(example.Pane().GetDocument()->GetTransferReport().PointsUpdated, 10);
 }
 
 void DesktopPaneTest::findSelectsTheNextMatchingRow() {

@@ -127,7 +127,7 @@ void DesktopWindowTest::commandsAreEnabledByTheirRules() {
     example.List().SelectRow(3);
     QVERIFY(window.IsCommandEnabled(cmd::GlobalEdit));
     // Not built: shown, disabled, and the tip says why.
-    for (const int id : {cmd::Transfer, cmd::Traverse, cmd::SurveyCode}) {
+    for (const int id : {cmd::Traverse, cmd::SurveyCode}) {
         QAction* action = window.Actions().Action(id);
         QVERIFY(action != nullptr);
         QVERIFY(!action->isEnabled());

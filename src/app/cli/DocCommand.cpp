@@ -11,6 +11,7 @@
 #include "ConsoleDialogHost.h"
 #include "ReductionOutput.h"
 #include "RunFiles.h"
+#include "SurveyTransfer.h"
 #include "TraverseOptions.h"
 #include "TraverseRun.h"
 #include "document/UListCtrl.h"
@@ -131,6 +132,25 @@ int Traverse(OpenJob& open, const std::string& name, const TraverseOptions& opti
     return status;
 }
 
+int Transfer(OpenJob& open, const std::string& name, const SurveyTransferOptions& options) {
+    UNeditDoc* doc = Find(open, name);
+    if (doc == nullptr) return exit_status::Failed;
+    open.host.SetEcho(!options.json);
+    open.host.SetInteractive(options.interactive);
+    UListCtrl& list = doc->OpenList();
+    const int reduced = doc->SetupDataBase(&list);
+    // Addition points went into the rows; they are kept with the document.
+    doc->SaveDocument();
+    if (reduced != 1) {
+        std::fprintf(stderr,
+                     "sxnedit: the reduction of %s did not reach its end; nothing was saved to "
+                     "the job\n",
+                     name.c_str());
+        return exit_status::Failed;
+    }
+    return SaveToSurvey(*doc, *doc->GetDatabase(), open.host, options);
+}
+
 int Rename(OpenJob& open, const std::string& from, const std::string& to) {
     if (open.container->HasName(Wide(to))) {
         std::fprintf(stderr, "sxnedit: the job has a document %s already\n", to.c_str());
@@ -157,6 +177,7 @@ struct DocOptions {
     std::string output;  // the file of an export, the report of a reduction
     bool json = false;
     TraverseOptions traverse;
+    SurveyTransferOptions transfer;
 };
 
 /// A doc command that opens the job and then does `work` on it.
@@ -228,6 +249,14 @@ void AddDocCommands(CLI::App& app, CommandRun& run) {
     AddTraverseOptions(*traverse, options->traverse);
     traverse->parse_complete_callback(
         [options] { CheckOutputOptions(options->traverse.report, options->traverse.json); });
+
+    CLI::App* transfer = AddDocCommand(
+        *doc, run, options, "transfer",
+        "reduce a stored document and save its points, lines,\n"
+        "arcs, circles and strings to the job (\"Save To Survey\")",
+        [](OpenJob& open, const DocOptions& o) { return Transfer(open, o.name, o.transfer); });
+    transfer->add_option("NAME", options->name, "the document")->required();
+    AddSurveyTransferOptions(*transfer, options->transfer);
 
     CLI::App* rename = AddDocCommand(
         *doc, run, options, "rename", "give a document another name",

@@ -3,12 +3,14 @@
 #include <CLI/CLI.hpp>
 #include <cstdio>
 #include <functional>
+#include <iterator>
 #include <map>
 #include <memory>
 #include <string>
 #include <vector>
 
 #include "Commands.h"
+#include "JobListings.h"
 #include "PointOutput.h"
 #include "RunFiles.h"
 #include "platform/io/LineReader.h"
@@ -225,6 +227,7 @@ int Info(const std::string& path) {
     Print(nedit::Format(L"Layers:         %lld\n", Count(*job, "SELECT count(*) FROM layer")));
     Print(
         nedit::Format(L"Survey codes:   %lld\n", Count(*job, "SELECT count(*) FROM survey_code")));
+    Print(nedit::Format(L"Transfers:      %lld\n", Count(*job, "SELECT count(*) FROM transfer")));
     Print(nedit::Format(L"Raw-data files: %lld\n",
                         Count(*job, "SELECT count(*) FROM storage WHERE parent_id IS NOT NULL")));
     return exit_status::Ok;
@@ -255,6 +258,25 @@ void AddJobCommands(CLI::App& app, CommandRun& run) {
     add("points", "list the job's points", [](const JobOptions& o) {
         return Points(o.job, o.json);
     })->add_flag("--json", options->json, "objects with id, e, n, h (null: no height) and code");
+    const std::pair<const char*, int (*)(const std::string&, bool)> listings[] = {
+        {"polylines", ListPolylines},
+        {"lines", ListLines},
+        {"arcs", ListArcs},
+        {"circles", ListCircles},
+        {"transfers", ListTransfers}};
+    const char* const listingHelp[] = {
+        "objects with name, layer, closed and vertices (id, e, n,\nh (null: no height), bulge)",
+        "objects with the two ends from and to (id, e, n, h) and\nthe layer",
+        "objects with start, end, centre, radius, sense and layer",
+        "objects with centre (id, e, n, h), radius and layer",
+        "objects with made_at, source, complete, written (counts)\nand not_written (kind, name, "
+        "reason)"};
+    for (std::size_t i = 0; i < std::size(listings); ++i) {
+        const auto list = listings[i].second;
+        add(listings[i].first, (std::string("list the job's ") + listings[i].first).c_str(),
+            [list](const JobOptions& o) { return list(o.job, o.json); })
+            ->add_flag("--json", options->json, listingHelp[i]);
+    }
     add("import-points",
         "add or update points from name,east,north,height,code\n"
         "rows (empty height: none; a later row of a name wins)",
