@@ -40,4 +40,15 @@ std::wstring TransferReport::Summary() const {
     return text;
 }
 
+std::wstring TransferReport::WrittenText() const {
+    const auto count = [](int n, const wchar_t* one, const wchar_t* many) {
+        return std::to_wstring(n) + L" " + Translate(n == 1 ? one : many);
+    };
+    return count(PointsAdded + PointsUpdated, L"point", L"points") + L", " +
+           count(LinesAdded + LinesUpdated, L"line", L"lines") + L", " +
+           count(ArcsAdded + ArcsUpdated, L"arc", L"arcs") + L", " +
+           count(Circles, L"circle", L"circles") + L", " +
+           count(PolylinesAdded + PolylinesReplaced, L"polyline", L"polylines");
+}
+
 }  // namespace nedit

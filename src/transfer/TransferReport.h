@@ -24,7 +24,7 @@ enum class TransferEnd {
     NotRun,    // no job, or nothing to transfer
     Declined,  // the user declined a question before anything was written
     Finished,
-    Aborted,  // the user aborted: the job is as it was before the run
+    Aborted,  // the user stopped the run: what was written before the stop stays
     Failed,   // a failure stopped the run: what was written before it stays
 };
 
@@ -52,6 +52,9 @@ struct TransferReport {
     /// The message that names what was left out and the locked points written over, at most
     /// kListed of each; empty when there is none.
     std::wstring Summary() const;
+    /// What was written, counted for people: "3 points, 2 lines, 0 arcs, 0 circles,
+    /// 1 polyline".
+    std::wstring WrittenText() const;
     static constexpr std::size_t kListed = 50;
 };
 

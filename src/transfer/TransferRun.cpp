@@ -31,7 +31,8 @@ int TransferRun::TransferToJob(const TransferSource& source) {
         UDBSQLiteTransaction transaction(Job);
         TransferContext context(*Job, Host, Progress, Codes, Report);
         const int result = Run(context, source);
-        if (Report.End == TransferEnd::Finished || Report.End == TransferEnd::Failed) {
+        if (Report.End == TransferEnd::Finished || Report.End == TransferEnd::Failed ||
+            Report.End == TransferEnd::Aborted) {
             RecordTransfer(Job->Database(), RecordOf(source.Name));
             transaction.Commit();
             Report.Kept = true;
@@ -42,7 +43,9 @@ int TransferRun::TransferToJob(const TransferSource& source) {
         const std::wstring summary = Report.Summary();
         if (!summary.empty()) context.Tell(summary, mb::IconExclamation);
         if (Report.End == TransferEnd::Aborted) {
-            context.Tell(Translate(L"The transfer was aborted: the job is as it was before it."),
+            context.Tell(Translate(L"The transfer was stopped: what was written before the stop "
+                                   L"({1}) is kept in the job, the rest was not written.",
+                                   {Report.WrittenText()}),
                          mb::IconInformation);
         }
         return result;
@@ -94,7 +97,7 @@ int TransferRun::Run(TransferContext& context, const TransferSource& source) {
         Report.End = TransferEnd::Failed;
         return TransferToJobFinal(context, 0);
     }
-    if (pointsEnd == PointTransfer::End::Aborted || context.WasAborted()) {
+    if (pointsEnd == PointTransfer::End::Aborted) {
         Report.End = TransferEnd::Aborted;
         return TransferToJobFinal(context, 1);
     }

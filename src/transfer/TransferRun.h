@@ -8,11 +8,13 @@
 // abort between objects.
 //
 // Decisions:
-// - One transaction holds the whole run. A run that ends, and a run stopped by a failure (the
-//   objects written before it stay), are kept; an abort, by the dialog's "Abort" or by the
-//   user's stop between objects, undoes the run, so the job is as it was before it and the
-//   steps that would only write are not run. A failure of the database itself (a busy job,
-//   a full disk) undoes the run as well, and says why.
+// - One transaction holds the whole run, so a killed program leaves the job as it was. A run
+//   that ends is kept; so is a run that the user stops, by the dialog's "Abort" or by the stop
+//   between objects, and a run stopped by a failure: what was written before the stop stays,
+//   as it always has, and the user is told how much that was and that the rest was not
+//   written. A stop between points still saves the code library and ends as a finished run
+//   does. A failure of the database itself (a busy job, a full disk) undoes the run, and
+//   says why.
 // - The locked layers asked about are those that the first feature codes of the points name
 //   (a feature code is compared with the names of the job's layers, as it always was); the
 //   run finds them itself from the points it is given.

@@ -30,9 +30,11 @@ check transfer-conflicts 1 "$here/expected/transfer-conflicts.json" \
   point P3: the job holds it with other coordinates (--existing)" -- \
     "$sxnedit" transfer "$site" --job "$job" --json
 check transfer-conflicts-kept 0 "$work/moved.txt" "" -- "$sxnedit" job points "$job"
-check transfer-abort 1 /dev/null "sxnedit: Not written to the job:
+# Abort at the first point the job holds with other coordinates: what was written before it
+# stays (one point, written again as it stands), nothing after it.
+check transfer-abort 1 "" "sxnedit: Not written to the job:
 point B: the reduction took its coordinates from the job, which stand
-sxnedit: The transfer was aborted: the job is as it was before it." -- \
+sxnedit: The transfer was stopped: what was written before the stop (1 point, 0 lines, 0 arcs, 0 circles, 0 polylines) is kept in the job, the rest was not written." -- \
     "$sxnedit" transfer "$site" --job "$job" --existing abort
 check transfer-abort-kept 0 "$work/moved.txt" "" -- "$sxnedit" job points "$job"
 
@@ -67,7 +69,8 @@ check transfer-overwritten 0 "$here/expected/transfer-points.txt" "" -- "$sxnedi
 check doc-transfer 0 "$(expected transfer-again.txt)" "" -- "$sxnedit" doc transfer "$job" DAY1
 # The job keeps a record of every transfer it kept, with what each left out.
 "$sxnedit" job transfers "$job" --json >"$work/transfers.json"
-[ "$(grep -c '"made_at"' "$work/transfers.json")" -eq 3 ] &&
+[ "$(grep -c '"made_at"' "$work/transfers.json")" -eq 4 ] &&
+    [ "$(grep -c '"complete": false' "$work/transfers.json")" -eq 1 ] &&
     grep -q '"source": "DAY1", "complete": true, "written": {"points": 3, "lines": 1' "$work/transfers.json" &&
     grep -q '"name": "B", "reason": "the reduction took its coordinates from the job, which stand"' "$work/transfers.json" &&
     passed=$((passed + 1)) || { echo "FAIL job-transfers"; cat "$work/transfers.json"; failed=$((failed + 1)); }

@@ -118,7 +118,8 @@ TEST_F(PointTransferTest, EachAnswerToAPointWithOtherCoordinates) {
     EXPECT_TRUE(Told(L"Invalid Prefix ! Point NEWP1 already exists !"));
     EXPECT_EQ(JobPointNamed(L"1").GetY(), 4.0);
 
-    // Abort: the job is as it was, the points written before in the run included.
+    // Abort: what was written before it stays (R, new, and Q, written again as it stands, come
+    // before P1), the rest is not written.
     points[0].y = 5.0;
     Point(L"R", 70, 70, 1.0);
     std::swap(points[0], points[2]);  // R first, then Q, then P1
@@ -126,10 +127,14 @@ TEST_F(PointTransferTest, EachAnswerToAPointWithOtherCoordinates) {
     const long before = Count("point");
     EXPECT_EQ(Transfer(), 1);
     EXPECT_EQ(report.End, TransferEnd::Aborted);
-    EXPECT_FALSE(report.Kept);
-    EXPECT_EQ(Count("point"), before);
-    EXPECT_EQ(JobPointNamed(L"R").GetId(), 0);
-    EXPECT_TRUE(Told(L"The transfer was aborted: the job is as it was before it."));
+    EXPECT_TRUE(report.Kept);
+    EXPECT_EQ(Count("point"), before + 1);
+    EXPECT_NE(JobPointNamed(L"R").GetId(), 0);
+    EXPECT_EQ(JobPointNamed(L"1").GetY(), 4.0);
+    EXPECT_TRUE(
+        Told(L"The transfer was stopped: what was written before the stop (2 points, "
+             L"0 lines, 0 arcs, 0 circles, 0 polylines) is kept in the job, the rest was "
+             L"not written."));
 }
 
 // "Apply this method to the rest of the process" with Overwrite: a locked point still asks

@@ -173,8 +173,9 @@ TEST_F(TransferRunTest, CirclesByRadiusAndThroughThreePoints) {
     EXPECT_EQ(centre.GetCode(), L"FN");
 }
 
-// An abort half-way leaves the job as it was: its points, lines and strings all unchanged.
-TEST_F(TransferRunTest, AbortHalfWayLeavesTheJobAsItWas) {
+// A stop half-way, among the lines, keeps what was written before it (the 40 points) and
+// writes nothing after it: the strings loop sees the stop and leaves, so no polyline.
+TEST_F(TransferRunTest, AStopHalfWayKeepsWhatWasWrittenBeforeIt) {
     JobPoint(L"OLD", 1, 1);
     for (int i = 0; i < 40; ++i) Point(L"P" + std::to_wstring(i), i, 0, 1.0, L"KB01");
     for (int i = 1; i < 40; ++i)
@@ -183,12 +184,17 @@ TEST_F(TransferRunTest, AbortHalfWayLeavesTheJobAsItWas) {
     TransferRun run(job.get(), &host, &aborting, wholeCodes);
     EXPECT_EQ(run.TransferToJob({points, lines, arcs, nullptr, L"SITE"}), 1);
     EXPECT_EQ(run.GetReport().End, TransferEnd::Aborted);
-    EXPECT_EQ(run.GetReport().PointsAdded, 0);
-    EXPECT_EQ(Count("point"), 1);
+    EXPECT_EQ(run.GetReport().PointsAdded, 40);
+    EXPECT_EQ(Count("point"), 41);
     EXPECT_EQ(Count("polyline"), 0);
     EXPECT_EQ(job->Database().TransactionDepth(), 0);
-    EXPECT_TRUE(ReadTransfers(job->Database()).empty());
-    EXPECT_TRUE(Told(L"The transfer was aborted: the job is as it was before it."));
+    const auto transfers = ReadTransfers(job->Database());
+    ASSERT_EQ(transfers.size(), 1u);
+    EXPECT_FALSE(transfers[0].Complete);
+    EXPECT_TRUE(
+        Told(L"The transfer was stopped: what was written before the stop (40 points, "
+             L"0 lines, 0 arcs, 0 circles, 0 polylines) is kept in the job, the rest was "
+             L"not written."));
 }
 
 // A job that another program holds for longer than the busy time-out: nothing is written,
