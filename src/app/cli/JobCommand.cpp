@@ -258,24 +258,25 @@ void AddJobCommands(CLI::App& app, CommandRun& run) {
     add("points", "list the job's points", [](const JobOptions& o) {
         return Points(o.job, o.json);
     })->add_flag("--json", options->json, "objects with id, e, n, h (null: no height) and code");
-    const std::pair<const char*, int (*)(const std::string&, bool)> listings[] = {
-        {"polylines", ListPolylines},
-        {"lines", ListLines},
-        {"arcs", ListArcs},
-        {"circles", ListCircles},
-        {"transfers", ListTransfers}};
-    const char* const listingHelp[] = {
-        "objects with name, layer, closed and vertices (id, e, n,\nh (null: no height), bulge)",
-        "objects with the two ends from and to (id, e, n, h) and\nthe layer",
-        "objects with start, end, centre, radius, sense and layer",
-        "objects with centre (id, e, n, h), radius and layer",
-        "objects with made_at, source, complete, written (counts)\nand not_written (kind, name, "
-        "reason)"};
-    for (std::size_t i = 0; i < std::size(listings); ++i) {
-        const auto list = listings[i].second;
-        add(listings[i].first, (std::string("list the job's ") + listings[i].first).c_str(),
+    struct Listing {
+        const char* name;
+        int (*list)(const std::string&, bool);
+        const char* jsonHelp;
+    };
+    const Listing listings[] = {
+        {"polylines", ListPolylines,
+         "objects with name, layer, closed and vertices (id, e, n,\nh (null: no height), bulge)"},
+        {"lines", ListLines, "objects with the two ends from and to (id, e, n, h) and\nthe layer"},
+        {"arcs", ListArcs, "objects with start, end, centre, radius, sense and layer"},
+        {"circles", ListCircles, "objects with centre (id, e, n, h), radius and layer"},
+        {"transfers", ListTransfers,
+         "objects with made_at, source, complete, written (counts)\nand not_written (kind, "
+         "name, reason)"}};
+    for (const Listing& listing : listings) {
+        const auto list = listing.list;
+        add(listing.name, (std::string("list the job's ") + listing.name).c_str(),
             [list](const JobOptions& o) { return list(o.job, o.json); })
-            ->add_flag("--json", options->json, listingHelp[i]);
+            ->add_flag("--json", options->json, listing.jsonHelp);
     }
     add("import-points",
         "add or update points from name,east,north,height,code\n"
