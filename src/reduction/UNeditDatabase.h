@@ -19,6 +19,7 @@
 #include <set>
 #include <string>
 #include <unordered_map>
+#include <unordered_set>
 #include <vector>
 
 #include "codes/ArcStore.h"
@@ -33,6 +34,7 @@
 #include "reduction/CError.h"
 #include "reduction/ObservationModel.h"
 #include "reduction/RowIndex.h"
+#include "reduction/RunRows.h"
 #include "reduction/RunStage.h"
 #include "reduction/StationList.h"
 
@@ -94,6 +96,9 @@ class UNeditDatabase {
         Rows = rows;
         RowIndexes.clear();
     }
+    /// The rows a run reads: while Generate runs, the rows it was given; otherwise those of
+    /// the record list. Empty without either.
+    nedit::RunRows GetRunRows() const;
     void SetReportPtr(UNeditReport* report) { Report = report; }
     UNeditReport* GetReport() const { return Report; }
     void SetFileName(const std::wstring& name) { FileName = name; }
@@ -141,7 +146,7 @@ class UNeditDatabase {
     int DeleteList();
     int GetListCount(int& stations, int& sideShots, int& forward) const;
     /// The first station of that exact name that is not a point-only node, or null.
-    STNSTRUCT* searchSTN(const std::wstring& name) const;
+    STNSTRUCT* searchSTN(std::wstring_view name) const;
     /// All such stations, the names compared without regard to case.
     int SearchSTN(const std::wstring& name, std::vector<STNSTRUCT*>& out) const;
     void InitUnitsAndAngleModes();
@@ -160,6 +165,8 @@ class UNeditDatabase {
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
     void SetCurHMode(wchar_t mode) { HMode = mode; }
     void SetTravFlag(int flag) { TravFlag = flag; }
+    /// The text that marks a check shot in a code; empty while no code settings are loaded.
+    const std::wstring& GetChkShotCode() const { return ChkShotCode; }
     const std::wstring& GetDateText() const { return DateText; }
 
     // ---- Averaging --------------------------------------------------------------------
@@ -188,6 +195,8 @@ class UNeditDatabase {
     /// 1 when the job has the point and it loads, with its values and code.
     int GetCoordFromSvyDoc(const std::wstring& name, double& e, double& n, double& z,
                            std::wstring& code) const;
+    /// The names for which the user took the job's coordinates in this run.
+    const std::set<std::wstring, std::less<>>& GetDbCoordNames() const { return DbCoordNames; }
     /// The job has a point of that name (whether or not it loads).
     bool JobHasPoint(const std::wstring& name) const;
     /// Coordinates are shown Easting first: the job's setting, and so without a job.
@@ -261,6 +270,14 @@ class UNeditDatabase {
     /// Forgets the adjusted points and deletes the rows from the lowest marker down.
     void DelAdjPts();
     void ClearAddPtList();
+    /// The positions of the last adjusted route become the traverse points, which the
+    /// re-reduction of side shots leaves where the adjustment put them. Null forgets them.
+    void UpdateTraversePoints(const std::vector<UNeditPt>* route);
+    /// The name is one of the traverse points, compared without regard to case.
+    bool IsTraversePoint(std::wstring_view name) const;
+    /// When `point`'s name is a traverse point: `point` becomes it (its name, position, no
+    /// code, no flags) and true is given.
+    bool GetTraversePoint(UNeditPt& point) const;
 
     const std::vector<UNeditPt>& GetPointList() const { return PointList.Items(); }
     const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList.Items(); }
@@ -407,6 +424,7 @@ class UNeditDatabase {
     bool Output = false;
     int ErrorCode = 0;
     nedit::TextLines ContentLines;
+    const std::vector<std::wstring>* GivenRows = nullptr;  // Generate's rows, while it runs
 
     // The observation model. Names and codes keep their ids for the life of the engine.
     nedit::NameTable Names;
@@ -455,6 +473,9 @@ class UNeditDatabase {
     std::vector<std::shared_ptr<const std::wstring>> CodeTexts;  // by code id
     nedit::PointStore AddPtList;
     nedit::PointStore TravPtList;
+    // The last adjusted route's points, and their names upper-cased for the look-up.
+    std::vector<UNeditPt> TravPtNames;
+    std::unordered_set<std::wstring> TravPtKeys;
     nedit::LineStore LineList;
     nedit::ArcStore ArcList;
     std::vector<UWCircle> CircleList;
