@@ -1,16 +1,12 @@
 #include "exports/DxfExport.h"
 
 #include <dxflib/dl_dxf.h>
-#include <unistd.h>
 
 #include <algorithm>
+#include <charconv>
 #include <cmath>
 #include <cstdio>
-#include <cstdlib>
-#include <fstream>
 #include <memory>
-#include <sstream>
-#include <stdexcept>
 #include <utility>
 
 #include "exports/BulgeArc.h"
@@ -55,33 +51,48 @@ double Elevation(const UWPoint& at) {
     return at.HasHeight() ? at.z : 0.0;
 }
 
-// A file of our own in the temporary folder, removed when done with.
-class ScratchFile {
+// dxflib's lines, gathered in memory. dxflib's own writer flushes its file after every line,
+// two million writes for 100,000 points; this one takes the same calls and keeps the text, so
+// the drawing is written whole as every output is. The base's stream is never written.
+class DrawingText : public DL_WriterA {
   public:
-    ScratchFile() {
-        const char* folder = std::getenv("TMPDIR");
-        path_ = std::string(folder != nullptr && *folder != '\0' ? folder : "/tmp") +
-                "/sxnedit-dxf-XXXXXX";
-        const int fd = ::mkstemp(path_.data());
-        if (fd < 0) throw std::runtime_error("no temporary file for the drawing in " + path_);
-        ::close(fd);
+    explicit DrawingText(std::string& text)
+        : DL_WriterA("/dev/null", DL_Codes::AC1015), text_(text) {}
+
+    void dxfReal(int gc, double value) const override {
+        char digits[512];  // any double in fixed notation
+        const auto end =
+            std::to_chars(digits, digits + sizeof digits, value, std::chars_format::fixed);
+        std::string real(digits, end.ptr);
+        // A real with its point, as CAD programs write them: 1000.0, not 1000.
+        if (real.find('.') == std::string::npos) real += ".0";
+        Line(gc, real);
     }
-    ~ScratchFile() { std::remove(path_.c_str()); }
-    ScratchFile(const ScratchFile&) = delete;
-    ScratchFile& operator=(const ScratchFile&) = delete;
-    const std::string& Path() const { return path_; }
+    void dxfInt(int gc, int value) const override { Line(gc, std::to_string(value)); }
+    void dxfHex(int gc, int value) const override {
+        char digits[16];
+        std::snprintf(digits, sizeof digits, "%X", static_cast<unsigned>(value));
+        Line(gc, digits);
+    }
+    void dxfString(int gc, const char* value) const override { Line(gc, value); }
+    void dxfString(int gc, const std::string& value) const override { Line(gc, value); }
 
   private:
-    std::string path_;
+    void Line(int gc, const std::string& value) const {
+        char code[16];
+        std::snprintf(code, sizeof code, "%3d\n", gc);
+        text_ += code;
+        text_ += value;
+        text_ += '\n';
+    }
+
+    std::string& text_;
 };
 
 class DrawingWriter {
   public:
-    DrawingWriter(const JobContents& contents, const std::string& path)
-        : contents_(contents), writer_(dxf_.out(path.c_str(), DL_Codes::AC1015)) {
-        if (!writer_ || writer_->openFailed())
-            throw std::runtime_error("the drawing cannot be written to " + path);
-    }
+    DrawingWriter(const JobContents& contents, std::string& text)
+        : contents_(contents), writer_(std::make_unique<DrawingText>(text)) {}
 
     void Write(std::vector<std::string>& messages) {
         Head();
@@ -94,7 +105,6 @@ class DrawingWriter {
         dxf_.writeObjects(*writer_);
         dxf_.writeObjectsEnd(*writer_);
         writer_->dxfEOF();
-        writer_->close();
         if (flat_points_ > 0) {
             messages.push_back(Counted(flat_points_, "point", "points") +
                                " without a height: at elevation 0 in the drawing");
@@ -246,16 +256,9 @@ class DrawingWriter {
 }  // namespace
 
 std::string DxfText(const JobContents& contents, std::vector<std::string>& messages) {
-    const ScratchFile scratch;
-    {
-        DrawingWriter drawing(contents, scratch.Path());
-        drawing.Write(messages);
-    }
-    std::ifstream in(scratch.Path(), std::ios::binary);
-    std::ostringstream bytes;
-    bytes << in.rdbuf();
-    if (!in) throw std::runtime_error("the drawing could not be read back from " + scratch.Path());
-    return bytes.str();
+    std::string text;
+    DrawingWriter(contents, text).Write(messages);
+    return text;
 }
 
 }  // namespace nedit

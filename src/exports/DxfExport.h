@@ -22,8 +22,7 @@
 
 namespace nedit {
 
-/// The drawing's text; `messages` gets what the format could not keep. Throws
-/// std::runtime_error when the drawing cannot be written.
+/// The drawing's text; `messages` gets what the format could not keep.
 std::string DxfText(const JobContents& contents, std::vector<std::string>& messages);
 
 /// The text of the drawing height of names and codes.

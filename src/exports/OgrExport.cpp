@@ -192,8 +192,10 @@ class GisWriter {
             // One kind of geometry to a Shapefile: the points and the linework apart.
             Dataset points(*gdal, folder.File(driver.file));
             WritePoints(*PointLayer(points, "points"));
+            points.Finish();
             Dataset linework(*gdal, folder.File("export_lines.shp"));
             WriteLinework(*LineworkLayer(linework, "linework"));
+            linework.Finish();
         } else if (format_ == ExportFormat::GeoJson) {
             Dataset all(*gdal, folder.File(driver.file));
             OGRLayer& layer = *all.Layer("job", srs_.get(), wkbUnknown, layer_options_.List());
@@ -201,10 +203,12 @@ class GisWriter {
             AddLineworkFields(layer);
             WritePoints(layer);
             WriteLinework(layer);
+            all.Finish();
         } else {
             Dataset both(*gdal, folder.File(driver.file));
             WritePoints(*PointLayer(both, "points"));
             WriteLinework(*LineworkLayer(both, "linework"));
+            both.Finish();
         }
     }
 
@@ -215,8 +219,23 @@ class GisWriter {
         Dataset(GDALDriver& driver, const std::string& path)
             : dataset_(driver.Create(path.c_str(), 0, 0, 0, GDT_Unknown, nullptr)) {
             if (dataset_ == nullptr) throw std::runtime_error(LastGdalError("GDAL cannot make it"));
+            // One transaction where the format has them (GeoPackage), not one per feature.
+            in_transaction_ = dataset_->StartTransaction() == OGRERR_NONE;
         }
-        ~Dataset() { GDALClose(dataset_); }
+        ~Dataset() {
+            if (dataset_ != nullptr) GDALClose(dataset_);
+        }
+
+        /// Commits and closes, which writes what GDAL still holds.
+        void Finish() {
+            const bool committed = !in_transaction_ || dataset_->CommitTransaction() == OGRERR_NONE;
+            CPLErrorReset();
+            GDALClose(dataset_);
+            const bool closed = CPLGetLastErrorType() < CE_Failure;
+            dataset_ = nullptr;
+            if (!committed || !closed)
+                throw std::runtime_error(LastGdalError("GDAL cannot finish it"));
+        }
         Dataset(const Dataset&) = delete;
         Dataset& operator=(const Dataset&) = delete;
 
@@ -230,6 +249,7 @@ class GisWriter {
 
       private:
         GDALDataset* dataset_;
+        bool in_transaction_ = false;
     };
 
     static void Field(OGRLayer& layer, const char* name, OGRFieldType type) {
