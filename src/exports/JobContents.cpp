@@ -30,14 +30,9 @@ std::string PointColumns(const char* table) {
 // Picks the objects of the layers asked for, and remembers which layers went out.
 class LayerFilter {
   public:
-    LayerFilter(JobDatabase& job, const std::vector<std::string>& wanted)
-        : wanted_(wanted.begin(), wanted.end()) {
-        auto query = job.Query("SELECT name FROM layer ORDER BY id");
-        std::set<std::string> known;
-        while (query->Step()) {
-            order_.push_back(Utf8(*query, 0));
-            known.insert(order_.back());
-        }
+    LayerFilter(USurveyDoc& job, const std::vector<std::string>& wanted)
+        : wanted_(wanted.begin(), wanted.end()), order_(JobLayerNames(job)) {
+        const std::set<std::string> known(order_.begin(), order_.end());
         for (const std::string& name : wanted_) {
             if (known.count(name) == 0) throw std::invalid_argument("the job has no layer " + name);
         }
@@ -169,9 +164,16 @@ void ReadPolylines(JobDatabase& job, LayerFilter& filter, std::vector<ExportPoly
 
 }  // namespace
 
+std::vector<std::string> JobLayerNames(USurveyDoc& job) {
+    std::vector<std::string> names;
+    auto query = job.Database().Query("SELECT name FROM layer ORDER BY id");
+    while (query->Step()) names.push_back(Utf8(*query, 0));
+    return names;
+}
+
 JobContents ReadJobContents(USurveyDoc& job, const std::vector<std::string>& layers) {
     JobDatabase& database = job.Database();
-    LayerFilter filter(database, layers);
+    LayerFilter filter(job, layers);
     JobContents contents;
     ReadPoints(database, filter, contents.points);
     ReadLines(database, filter, contents.lines);

@@ -78,6 +78,9 @@ struct JobContents {
     std::vector<ExportPolyline> polylines;
 };
 
+/// The names of the job's layers, in the order they were made.
+std::vector<std::string> JobLayerNames(USurveyDoc& job);
+
 /// Reads the job's objects on the layers named (all when none are). Throws JobError when
 /// the job cannot be read, and std::invalid_argument naming a layer the job does not have.
 JobContents ReadJobContents(USurveyDoc& job, const std::vector<std::string>& layers);
