@@ -156,6 +156,8 @@ class CNeditViewPane : public QWidget, private UTransferView {
     void OnFileSaveAs();
     void OnImportNeutral();
     void OnExportNeutral();
+    /// "Export...": the job's objects, and for LandXML this document's observations.
+    void OnFileExport();
     void OnFilePrint();
     void OnEditCut();
     void OnEditCopy();

@@ -51,6 +51,7 @@ constexpr int Download = 34603;
 constexpr int ImportRawfile = 34651;
 constexpr int ImportNeutral = 34601;
 constexpr int ExportNeutral = 34602;
+constexpr int Export = 34780;  // the desktop's own: the job for CAD and GIS
 constexpr int FilePrint = 57607;
 constexpr int Exit = 34608;
 

@@ -88,6 +88,9 @@ std::vector<CommandInfo> MakeCommands() {
                 "Read a neutral file into the document, replacing its records", "Ctrl+I"),
         Command(ExportNeutral, kFile, "Export Neutral File...", kAlways,
                 "Write the document's records to a neutral file", "Ctrl+E"),
+        Command(Export, kFile, "Export...", kIdle,
+                "Write the job for CAD and GIS (DXF, GeoPackage, GeoJSON, Shapefile, KML, CSV) or "
+                "as LandXML with the document's observations"),
         Separator(kFile),
         Command(FilePrint, kFile, "Print...", kAlways, "Print the records", "Ctrl+P"),
         Separator(kFile),

@@ -12,6 +12,9 @@
 #include "document/UListCtrl.h"
 #include "document/UNeditDoc.h"
 #include "document/URawDataContainer.h"
+#include "exports/JobContents.h"
+#include "exports/JobCrs.h"
+#include "exports/UExportDlg.h"
 #include "instruments/PortStores.h"
 #include "instruments/USetComm.h"
 #include "platform/job/USurveyDoc.h"
@@ -93,6 +96,9 @@ bool CNeditViewPane::OnCommand(int id) {
             break;
         case cmd::ExportNeutral:
             OnExportNeutral();
+            break;
+        case cmd::Export:
+            OnFileExport();
             break;
         case cmd::FilePrint:
             OnFilePrint();
@@ -280,6 +286,21 @@ void CNeditViewPane::OnExportNeutral() {
     SetLastDirectory(path);
     if (!QFileInfo(path).fileName().contains(QLatin1Char('.'))) path += QStringLiteral(".neu");
     ExportNeutralFile(path);
+}
+
+void CNeditViewPane::OnFileExport() {
+    if (SurveyDocument == nullptr) return;
+    const std::string name = ToUtf8(Document->GetName());
+    UExportDlg dialog(SurveyDocument->GetPathName(), JobLayerNames(*SurveyDocument),
+                      ReadJobCrs(SurveyDocument->Database()), name);
+    if (Host->Run(dialog) != mb::IdOk) return;
+    const ExportResult result = dialog.Export(*SurveyDocument, {name, ListCtrl->GetRows()});
+    std::wstring said;
+    for (const std::string& message : result.messages) said += FromUtf8(message) + L"\n";
+    if (!said.empty())
+        AppMessageBox(Host, said, result.written ? mb::IconInformation : mb::IconStop);
+    if (result.written)
+        emit statusMessage(tr("Exported the job to %1").arg(QString::fromStdString(dialog.Output)));
 }
 
 bool CNeditViewPane::ExportNeutralFile(const QString& path) {

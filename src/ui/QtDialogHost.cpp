@@ -12,6 +12,7 @@
 #include "ui/forms/DisplaySettingsForm.h"
 #include "ui/forms/DownloadForm.h"
 #include "ui/forms/EditRecordForm.h"
+#include "ui/forms/ExportForm.h"
 #include "ui/forms/FileDialogForm.h"
 #include "ui/forms/GenericForm.h"
 #include "ui/forms/GetNameForm.h"
@@ -84,6 +85,7 @@ QtDialogHost::QtDialogHost(QWidget* parent) : parent_(parent) {
     SetForm<DownloadForm, UNEDownload>();
     SetForm<PortSettingsForm, USetComm>();
     SetForm<UploadSelectionForm, UUploadSource>();
+    SetForm<ExportForm, UExportDlg>();
     // The raw file dialog ends with the button that ended it.
     SetFace<ULoadRawDlg>([this](ULoadRawDlg& dialog) {
         return ShowForm<LoadRawForm>(dialog) == mb::IdOk ? dialog.GetEndCode() : mb::IdCancel;

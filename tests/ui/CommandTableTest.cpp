@@ -59,6 +59,7 @@ void CommandTableTest::menuTexts_data() {
     row(cmd::ImportRawfile, "File", "Import Raw Data File...", true);
     row(cmd::ImportNeutral, "File", "Import Neutral File...", true);
     row(cmd::ExportNeutral, "File", "Export Neutral File...", true);
+    row(cmd::Export, "File", "Export...", true);
     row(cmd::FilePrint, "File", "Print...", true);
     row(cmd::Exit, "File", "Close", true);
     row(cmd::EditCut, "Edit", "Cut", true);
