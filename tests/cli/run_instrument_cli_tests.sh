@@ -45,7 +45,8 @@ Usage: sxnedit download [OPTIONS]
 Run 'sxnedit download --help' for more information." -- "$sxnedit" download --instrument "Leica GSI"
 check download-bad-parity 64 /dev/null "" -- "$sxnedit" download --instrument "Leica GSI" --port COM1 --parity maybe
 
-# The RW5 traverse imported and reduced: its stations where the data collector put them.
+# The RW5 traverse imported and reduced, its stations where the data collector put them;
+# its route found and adjusted, the misclose against the closure the file records.
 python3 "$here/rw5_traverse.py" "$sxnedit" "$raw/Trav_19leg.rw5" "$work" &&
     passed=$((passed + 1)) || { echo "FAIL rw5-traverse"; failed=$((failed + 1)); }
 
