@@ -27,3 +27,4 @@ void AddTransferCommand(CLI::App& app, CommandRun& run);
 void AddInstrumentsCommand(CLI::App& app, CommandRun& run);
 void AddImportCommand(CLI::App& app, CommandRun& run);
 void AddDownloadCommand(CLI::App& app, CommandRun& run);
+void AddUploadCommand(CLI::App& app, CommandRun& run);

@@ -74,6 +74,7 @@ int Run(int argc, char** argv) {
     AddInstrumentsCommand(app, run);
     AddImportCommand(app, run);
     AddDownloadCommand(app, run);
+    AddUploadCommand(app, run);
     app.footer(kFooter);  // after the commands, which would take it over
     try {
         app.parse(argc, argv);
