@@ -14,7 +14,7 @@ no_station="sxnedit: The data hold observations before any station block; they a
 
 check instruments 0 "$here/expected/instruments.txt" "" -- "$sxnedit" instruments
 check instruments-usage 64 /dev/null "" -- "$sxnedit" instruments --all
-"$sxnedit" instruments --json | python3 -c 'import json, sys; d = json.load(sys.stdin); names = [x["name"] for x in d["drivers"]]; assert len(names) == 10 and "Carlson RW5" in names and d["drivers"][names.index("Leica GSI")]["extensions"] == ["gsi", "gs8", "gs16"] and d["refused"] == []' &&
+"$sxnedit" instruments --json | python3 -c 'import json, sys; d = json.load(sys.stdin); names = [x["name"] for x in d["drivers"]]; assert len(names) == 10 and "Carlson RW5" in names and d["drivers"][names.index("Leica GSI")]["extensions"] == ["gsi", "gs8", "gs16"] and [x["name"] for x in d["drivers"] if x["upload"]] == ["Leica GSI", "Neutral"] and d["refused"] == []' &&
     passed=$((passed + 1)) || { echo "FAIL instruments-json"; failed=$((failed + 1)); }
 
 check import-stdout 0 "$here/expected/rilievo-gon.neu" "$no_station" -- "$sxnedit" import "$raw/RILIEVO.gsi" --instrument "leica gsi" --angles gon
