@@ -1,5 +1,6 @@
 #include "DriverSession.h"
 
+#include <algorithm>
 #include <charconv>
 #include <cmath>
 #include <cstdlib>
@@ -158,6 +159,17 @@ void sxn_session::Acknowledge(bool accepted) const {
     if ((flags_ & SXN_DOWNLOAD_ACKNAK) == 0 || host_.send == nullptr) return;
     const unsigned char answer = accepted ? 0x06 : 0x15;
     host_.send(host_.context, &answer, 1);
+}
+
+bool sxn_session::Send(std::string_view bytes) const {
+    if (host_.send == nullptr) return false;
+    while (!bytes.empty()) {
+        const long taken = host_.send(
+            host_.context, reinterpret_cast<const unsigned char*>(bytes.data()), bytes.size());
+        if (taken <= 0) return false;
+        bytes.remove_prefix(std::min(bytes.size(), static_cast<std::size_t>(taken)));
+    }
+    return true;
 }
 
 // The functions that every driver exports alike. A C caller cannot take an exception, so

@@ -68,6 +68,9 @@ struct sxn_session {
     void Message(const std::string& text) const;
     /// ACK for a block read, NAK for one refused, when the download asked for them.
     void Acknowledge(bool accepted) const;
+    /// All of `bytes` to the instrument (or the file the program writes); false when the
+    /// host has no send or its send fails or takes nothing.
+    bool Send(std::string_view bytes) const;
     const sxn::OutputUnits& Units() const { return units_; }
 
   private:

@@ -21,6 +21,20 @@ std::string Field(const char* key, const std::string& value) {
 
 }  // namespace
 
+std::string PointRecord(const std::string& id, const std::string& east, const std::string& north,
+                        const std::string& height, const std::string& code) {
+    return "PT ID=" + id + Field("E", east) + Field("N", north) + Field("H", height) +
+           Field("CO", code);
+}
+
+std::string NoValueText() {
+    return Fixed(kNoValue, 3);
+}
+
+const char* NeutralHeader() {
+    return kHeader;
+}
+
 void CompleteSight(Observation& sight, const std::optional<Angle>& zenith,
                    const std::optional<Length>& slope, const std::optional<Length>& level,
                    const std::optional<Length>& rise) {
@@ -112,7 +126,7 @@ void NeutralWriter::Unread(long line, std::string_view bytes) {
 }
 
 std::string NeutralWriter::LengthText(const std::optional<Length>& length) const {
-    return length ? length->Text(units_.length) : Fixed(kNoValue, 3);
+    return length ? length->Text(units_.length) : NoValueText();
 }
 
 void NeutralWriter::Station(const std::string& id, const std::optional<Length>& height,
@@ -129,8 +143,7 @@ void NeutralWriter::Xyz(const std::string& id, const Coordinates& at) {
 }
 
 void NeutralWriter::Point(const std::string& id, const Coordinates& at, const std::string& code) {
-    Record("PT ID=" + id + Field("E", LengthText(at.east)) + Field("N", LengthText(at.north)) +
-           Field("H", LengthText(at.height)) + Field("CO", code));
+    Record(PointRecord(id, LengthText(at.east), LengthText(at.north), LengthText(at.height), code));
 }
 
 void NeutralWriter::Observe(const Observation& observation) {

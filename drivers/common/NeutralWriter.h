@@ -56,6 +56,14 @@ void CompleteSight(Observation& sight, const std::optional<Angle>& zenith,
                    const std::optional<Length>& slope, const std::optional<Length>& level,
                    const std::optional<Length>& rise);
 
+/// "PT ID=…,E=…,N=…,H=…,CO=…": a point record of values already written as text.
+std::string PointRecord(const std::string& id, const std::string& east, const std::string& north,
+                        const std::string& height, const std::string& code);
+/// The text of a coordinate without a value (-10000: no height).
+std::string NoValueText();
+/// The neutral file's header line.
+const char* NeutralHeader();
+
 /// A name or code as a field of a neutral record: trimmed, UTF-8, without separators.
 std::string FieldText(std::string_view text);
 /// Bytes as printable UTF-8 text for a comment, control characters as blanks.

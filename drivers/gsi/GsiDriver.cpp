@@ -1,10 +1,12 @@
 // The driver for Leica GSI, GSI-8 and GSI-16 alike: raw files and downloads over a serial
 // link. What the blocks become is told in GsiTranslator.h, how they are found in
-// GsiBlockReader.h, and how words are read in GsiWord.h.
+// GsiBlockReader.h, and how words are read in GsiWord.h. Points go out as a GSI-16
+// coordinate file (GsiUpload.h).
 
 #include "DriverSession.h"
 #include "GsiBlockReader.h"
 #include "GsiTranslator.h"
+#include "GsiUpload.h"
 
 namespace {
 
@@ -65,6 +67,10 @@ SXN_DRIVER_EXPORT sxn_session* sxn_driver_import(const sxn_host* host, unsigned 
 SXN_DRIVER_EXPORT sxn_session* sxn_driver_download(const sxn_host* host, unsigned mode,
                                                    unsigned flags) {
     return sxn::Start<GsiSession>(host, mode, flags, true);
+}
+
+SXN_DRIVER_EXPORT sxn_session* sxn_driver_upload(const sxn_host* host, unsigned mode) {
+    return sxn::Start<GsiUploadSession>(host, mode, 0u, true);
 }
 
 }  // extern "C"

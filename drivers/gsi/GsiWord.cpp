@@ -42,7 +42,35 @@ bool InFeet(char unit) {
     return unit == '1' || unit == '7';
 }
 
+constexpr int kGsi16Digits = 16;
+
+std::string TwoDigits(int index) {
+    return {static_cast<char>('0' + index / 10 % 10), static_cast<char>('0' + index % 10)};
+}
+
 }  // namespace
+
+std::string GsiTextWord(int index, std::string_view information, std::string_view text) {
+    return TwoDigits(index) + std::string(information) + '+' +
+           std::string(kGsi16Digits - text.size(), '0') + std::string(text);
+}
+
+bool GsiTextFits(std::string_view text) {
+    if (text.empty() || text.size() > kGsi16Digits) return false;
+    for (const char c : text) {
+        if (c <= ' ' || c >= 0x7F) return false;
+    }
+    return true;
+}
+
+bool GsiLengthWord(int index, double value, bool usFeet, std::string& word) {
+    const double scaled = std::round(std::fabs(value) * 1e4);
+    if (!(scaled < 1e16)) return false;
+    const std::string digits = std::to_string(static_cast<long long>(scaled));
+    word = TwoDigits(index) + (usFeet ? "...7" : "...6") + (value < 0 && scaled > 0 ? '-' : '+') +
+           std::string(kGsi16Digits - digits.size(), '0') + digits;
+    return true;
+}
 
 bool ParseGsiWord(std::string_view token, GsiWord& word) {
     if (token.size() != 15 && token.size() != 23) return false;

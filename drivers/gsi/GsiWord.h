@@ -57,6 +57,16 @@ struct GsiLength {
     std::string Text(sxn::LengthOut out) const;
 };
 
+/// A GSI-16 word of text (point number, code) with its four places of information: the
+/// text right-aligned in 16 characters and padded with zeros, as instruments write it. The
+/// text must be 1 to 16 printable ASCII characters without blanks (GsiTextFits).
+std::string GsiTextWord(int index, std::string_view information, std::string_view text);
+/// True when `text` can stand in a GSI-16 text word.
+bool GsiTextFits(std::string_view text);
+/// A GSI-16 word of a length: `value` in metres (unit 6) or US feet (unit 7), 1/10,000 of
+/// either. False when it does not fit in 16 digits.
+bool GsiLengthWord(int index, double value, bool usFeet, std::string& word);
+
 /// False, with the value untouched, for a word whose unit is not an angle's or whose value
 /// is not a whole number (sexagesimal minutes and seconds below 60).
 bool ReadGsiAngle(const GsiWord& word, GsiAngle& angle);

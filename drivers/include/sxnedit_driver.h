@@ -1,5 +1,5 @@
 /*
- * The interface between SXNedit and its instrument drivers, version 1.
+ * The interface between SXNedit and its instrument drivers, version 2.
  *
  * A driver is a shared library that exports the functions below with C linkage. It turns
  * what an instrument recorded or sends into neutral records, one text line at a time; it
@@ -8,8 +8,12 @@
  * Everything the instrument sent is kept by the program in the raw file, whatever the
  * driver makes of it.
  *
- * The program refuses a driver whose sxn_driver_api_version() differs from
- * SXN_DRIVER_API_VERSION, or that lacks any of the functions.
+ * Version 2 adds the upload: points of a job written in the instrument's format. Its two
+ * functions are optional; a driver that cannot write points leaves them out.
+ *
+ * The program refuses a driver whose sxn_driver_api_version() lies outside
+ * SXN_DRIVER_API_OLDEST to SXN_DRIVER_API_VERSION, or that lacks any function of version 1.
+ * A driver of version 1 still loads and reads; the program never asks it for an upload.
  *
  * Threads: the program calls a session from one thread at a time. Calls never throw.
  */
@@ -22,12 +26,14 @@
 extern "C" {
 #endif
 
-#define SXN_DRIVER_API_VERSION 1u
+#define SXN_DRIVER_API_VERSION 2u
+/* The oldest interface version the program still loads. */
+#define SXN_DRIVER_API_OLDEST 1u
 
 #define SXN_DRIVER_EXPORT __attribute__((visibility("default")))
 
-/* Import mode: bits 0 to 2 the angular unit of the records, bits 3 to 5 the linear unit.
- * Any other value of a group counts as its first unit. */
+/* Import mode (also the upload's): bits 0 to 2 the angular unit of the records, bits 3 to 5 the
+ * linear unit. Any other value of a group counts as its first unit. */
 #define SXN_MODE_DMS 1u     /* ddd.mmss */
 #define SXN_MODE_DEGREES 2u /* decimal degrees */
 #define SXN_MODE_GONS 4u
@@ -85,6 +91,19 @@ SXN_DRIVER_EXPORT int sxn_driver_time_out(sxn_session* session, unsigned idle_ms
 SXN_DRIVER_EXPORT void sxn_driver_finish(sxn_session* session);
 /* Stops the session at once, without further records, and frees it. */
 SXN_DRIVER_EXPORT void sxn_driver_abort(sxn_session* session);
+
+/* Version 2, optional: the upload. A session that writes points for the instrument; their
+ * bytes go out through the host's send, to the serial port or to a file that the program
+ * writes. Coordinates come in the linear unit of `mode`. Null on failure. The session ends
+ * with sxn_driver_finish (which sends what closes the data) or sxn_driver_abort. */
+SXN_DRIVER_EXPORT sxn_session* sxn_driver_upload(const sxn_host* host, unsigned mode);
+/* One point of an upload: name and code UTF-8 (the code may be empty), `has_height` 0 for a
+ * point without height. Gives 1 when it was sent; 0 when the format cannot hold the point (a
+ * message has said why) and the upload goes on without it; -1 when the host's send failed,
+ * and the session should be aborted. */
+SXN_DRIVER_EXPORT int sxn_driver_upload_point(sxn_session* session, const char* name,
+                                              const char* code, double east, double north,
+                                              double height, int has_height);
 
 #ifdef __cplusplus
 }

@@ -18,10 +18,11 @@
 
 #include "DriverSession.h"
 #include "LineSplitter.h"
+#include "NeutralWriter.h"
+#include "UploadSession.h"
 
 namespace {
 
-constexpr const char* kHeader = "#VERSION-1.0 NEUTRAL FILE";
 // Bytes of a line that are kept; beyond this a line is too long for any record anyway.
 constexpr std::size_t kKeep = SXN_RECORD_MAX + 1;
 constexpr std::size_t kShownOfLongLine = 150;
@@ -88,7 +89,7 @@ class NeutralSession : public sxn_session {
             return false;
         }
         if (link_) {
-            Record(kHeader);
+            Record(sxn::NeutralHeader());
             return true;
         }
         Message("Neutral file header not found.");
@@ -101,6 +102,33 @@ class NeutralSession : public sxn_session {
     long too_long_ = 0;
     bool header_seen_ = false;
     bool ended_ = false;  // the data were refused
+};
+
+// The upload: a neutral file of PT records, after the header and the record of its units.
+// Coordinates are written to 1/10,000 of the unit; names and codes lose the commas and '='
+// that would end their field ("_" stands there), as every neutral record written does.
+class NeutralUploadSession : public UploadSession {
+  public:
+    NeutralUploadSession(const sxn_host& host, unsigned mode, unsigned, bool)
+        : UploadSession(host, mode) {}
+
+    int Point(const sxn::UploadPoint& point) override {
+        std::string text;
+        if (!started_)
+            text = std::string(sxn::NeutralHeader()) + "\n" + Units().UnitRecord() + "\n";
+        text +=
+            sxn::PointRecord(sxn::FieldText(point.name), sxn::Fixed(point.east, 4),
+                             sxn::Fixed(point.north, 4),
+                             point.has_height ? sxn::Fixed(point.height, 4) : sxn::NoValueText(),
+                             sxn::FieldText(point.code)) +
+            "\n";
+        if (!Send(text)) return -1;
+        started_ = true;
+        return 1;
+    }
+
+  private:
+    bool started_ = false;
 };
 
 }  // namespace
@@ -126,6 +154,10 @@ SXN_DRIVER_EXPORT sxn_session* sxn_driver_import(const sxn_host* host, unsigned 
 SXN_DRIVER_EXPORT sxn_session* sxn_driver_download(const sxn_host* host, unsigned mode,
                                                    unsigned flags) {
     return sxn::Start<NeutralSession>(host, mode, flags, true);
+}
+
+SXN_DRIVER_EXPORT sxn_session* sxn_driver_upload(const sxn_host* host, unsigned mode) {
+    return sxn::Start<NeutralUploadSession>(host, mode, 0u, true);
 }
 
 }  // extern "C"

@@ -16,13 +16,16 @@ bool CheckDriver(const PluginLibrary& library, std::string& payload, std::string
     DriverFunctions functions;
     if (!functions.Resolve(library, error)) return false;
     const unsigned version = functions.apiVersion();
-    if (version != SXN_DRIVER_API_VERSION) {
+    if (version < SXN_DRIVER_API_OLDEST || version > SXN_DRIVER_API_VERSION) {
         error = "it was built for version " + std::to_string(version) +
-                " of the driver interface; this program takes version " +
+                " of the driver interface; this program takes versions " +
+                std::to_string(SXN_DRIVER_API_OLDEST) + " to " +
                 std::to_string(SXN_DRIVER_API_VERSION);
         return false;
     }
-    for (const char* text : {functions.name(), functions.description(), functions.extensions()}) {
+    const char* uploads = functions.CanUpload() ? "upload" : "";
+    for (const char* text :
+         {functions.name(), functions.description(), functions.extensions(), uploads}) {
         payload += text != nullptr ? text : "";
         payload += '\0';
     }
@@ -63,7 +66,16 @@ bool DriverFunctions::Resolve(const PluginLibrary& library, std::string& error) 
     take(timeOut, "sxn_driver_time_out");
     take(finish, "sxn_driver_finish");
     take(abort, "sxn_driver_abort");
-    return error.empty();
+    if (!error.empty()) return false;
+    if (apiVersion() >= 2) {
+        upload = library.Get<decltype(upload)>("sxn_driver_upload");
+        uploadPoint = library.Get<decltype(uploadPoint)>("sxn_driver_upload_point");
+    }
+    if (!CanUpload()) {
+        upload = nullptr;
+        uploadPoint = nullptr;
+    }
+    return true;
 }
 
 std::string DriverCatalogue::DefaultDirectory() {
@@ -84,6 +96,7 @@ DriverCatalogue::DriverCatalogue(const std::string& directory) : directory_(dire
         info.name = NextText(probe.payload, at);
         info.description = NextText(probe.payload, at);
         info.extensions = NextText(probe.payload, at);
+        info.uploads = !NextText(probe.payload, at).empty();
         info.path = path;
         if (const DriverInfo* same = Find(info.name)) {
             refused_.push_back({FileName(path), "a driver of the same name, " + ToUtf8(info.name) +

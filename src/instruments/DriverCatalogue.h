@@ -1,9 +1,11 @@
 #pragma once
 // The instrument drivers found in a directory. Every shared library there is first tried in
-// a child process (PluginProbe): it must open, export every function of the driver
-// interface, be of this program's interface version and give an instrument name that no
-// driver before it gave. A library that fails any of that, or crashes or hangs on the way,
-// is refused with the reason, by its file name; the others are listed.
+// a child process (PluginProbe): it must open, export every function of version 1 of the
+// driver interface, be of an interface version this program takes (SXN_DRIVER_API_OLDEST to
+// SXN_DRIVER_API_VERSION) and give an instrument name that no driver before it gave. A
+// driver of version 2 or later that exports both upload functions can upload. A library that fails
+// any of that, or crashes or hangs on the way, is refused with the reason, by its file name; the
+// others are listed.
 //
 // Drivers lie in $SXNEDIT_DRIVER_DIR when it is set and not empty, else in drivers/ beside
 // the program.
@@ -22,6 +24,7 @@ struct DriverInfo {
     std::wstring description;
     std::wstring extensions;  // comma-separated, without dots
     std::string path;
+    bool uploads = false;  // it writes points for its instrument
 };
 
 struct RefusedDriver {
@@ -41,9 +44,15 @@ struct DriverFunctions {
     decltype(&sxn_driver_time_out) timeOut = nullptr;
     decltype(&sxn_driver_finish) finish = nullptr;
     decltype(&sxn_driver_abort) abort = nullptr;
+    // Optional, of version 2: both or neither.
+    decltype(&sxn_driver_upload) upload = nullptr;
+    decltype(&sxn_driver_upload_point) uploadPoint = nullptr;
 
-    /// Takes every function from `library`; false, naming the first missing one in `error`.
+    /// Takes every function of version 1 from `library`; false, naming the first missing one
+    /// in `error`. The upload functions are taken when the library's version has them and it
+    /// exports both.
     bool Resolve(const PluginLibrary& library, std::string& error);
+    bool CanUpload() const { return upload != nullptr && uploadPoint != nullptr; }
 };
 
 class DriverCatalogue {

@@ -100,6 +100,8 @@ int UDeviceManager::LoadDLL(const std::wstring& name) {
 
 int UDeviceManager::DeleteDLL() {
     Abort();
+    if (Upload != nullptr) Driver->functions.abort(Upload);
+    Upload = nullptr;
     Driver.reset();
     return 1;
 }
@@ -226,6 +228,53 @@ void UDeviceManager::Abort() {
     CloseFiles();
 }
 
+bool UDeviceManager::CanUpload() const {
+    return Driver && Driver->functions.CanUpload();
+}
+
+int UDeviceManager::StartUpload(unsigned mode, std::string* file) {
+    Abort();
+    if (!Driver) return Fail(nedit::Translate(L"No driver is loaded."));
+    if (!CanUpload()) {
+        return Fail(
+            nedit::Translate(L"The driver {1} cannot upload points.", {Driver->info->name}));
+    }
+    if (file == nullptr && !Port.IsOpen()) return Fail(nedit::Translate(L"No port is open."));
+    if (Upload != nullptr) Driver->functions.abort(Upload);
+    UploadFile = file;
+    if (file != nullptr) file->clear();
+    SendFailed = false;
+    const sxn_host host{this, &OnRecord, &OnMessage, &OnSend};
+    Upload = Driver->functions.upload(&host, mode);
+    if (Upload == nullptr) {
+        return Fail(
+            nedit::Translate(L"The driver {1} did not start the upload.", {Driver->info->name}));
+    }
+    return 1;
+}
+
+int UDeviceManager::UploadPoint(const std::string& name, const std::string& code, double east,
+                                double north, double height, bool hasHeight) {
+    if (Upload == nullptr) return -1;
+    const int sent = Driver->functions.uploadPoint(Upload, name.c_str(), code.c_str(), east, north,
+                                                   height, hasHeight ? 1 : 0);
+    if (sent >= 0 && !SendFailed) return sent;
+    Driver->functions.abort(Upload);
+    Upload = nullptr;
+    if (!SendFailed) Fail(nedit::Translate(L"The driver {1} failed.", {Driver->info->name}));
+    return -1;
+}
+
+int UDeviceManager::EndUpload() {
+    if (Upload == nullptr) return 0;
+    Driver->functions.finish(Upload);
+    Upload = nullptr;
+    if (SendFailed) return 0;
+    const auto wait = static_cast<int>(TimeOutPeriod.count());
+    if (UploadFile == nullptr && !Port.Drain(wait)) return Fail(nedit::FromUtf8(Port.LastError()));
+    return 1;
+}
+
 std::vector<std::wstring> UDeviceManager::TakeMessages() {
     std::vector<std::wstring> taken;
     taken.swap(Messages);
@@ -293,5 +342,17 @@ void UDeviceManager::OnMessage(void* context, const char* text) {
 }
 
 long UDeviceManager::OnSend(void* context, const unsigned char* bytes, std::size_t size) {
-    return static_cast<UDeviceManager*>(context)->Port.Write(bytes, size);
+    auto* manager = static_cast<UDeviceManager*>(context);
+    if (manager->Upload == nullptr) return manager->Port.Write(bytes, size);
+    if (manager->UploadFile != nullptr) {
+        manager->UploadFile->append(reinterpret_cast<const char*>(bytes), size);
+        return static_cast<long>(size);
+    }
+    const long sent =
+        manager->Port.WriteAll(bytes, size, static_cast<int>(manager->TimeOutPeriod.count()));
+    if (sent < 0 && !manager->SendFailed) {
+        manager->SendFailed = true;
+        manager->Fail(nedit::FromUtf8(manager->Port.LastError()));
+    }
+    return sent;
 }

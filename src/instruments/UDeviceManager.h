@@ -104,6 +104,23 @@ class UDeviceManager {
     /// Stops a running transfer; what was not taken is dropped.
     void Abort();
 
+    // ---- The upload ---------------------------------------------------------------------------
+    // StartUpload, a call of UploadPoint for each point, EndUpload. The bytes the driver
+    // writes go to the open port, or into `file` for the caller to write.
+    /// True when the loaded driver writes points for its instrument.
+    bool CanUpload() const;
+    /// Starts an upload with coordinates in the linear unit of `mode`: into `*file` (emptied
+    /// first) when given, else to the open port. 0, with GetLastError(), when no driver that
+    /// uploads is loaded, no port is open or the driver does not start.
+    int StartUpload(unsigned mode, std::string* file = nullptr);
+    /// 1 sent; 0 the driver's format cannot hold the point (TakeMessages says why); -1 the
+    /// link failed (GetLastError), and the upload has ended.
+    int UploadPoint(const std::string& name, const std::string& code, double east, double north,
+                    double height, bool hasHeight);
+    /// Ends the upload: the driver sends what closes the data, and a port is waited on until
+    /// all has left it. 0, with GetLastError(), when that fails.
+    int EndUpload();
+
     // ---- Around the contract ----------------------------------------------------------------
     void SetDialogHost(nedit::DialogHost* host) { Host = host; }
     /// Acknowledgements (ACK/NAK) during the next download.
@@ -158,4 +175,7 @@ class UDeviceManager {
     std::wstring LastError;
     long long BytesReceived = 0;
     std::chrono::steady_clock::time_point LastByte;
+    sxn_session* Upload = nullptr;
+    std::string* UploadFile = nullptr;  // where the upload goes when not to the port
+    bool SendFailed = false;
 };

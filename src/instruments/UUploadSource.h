@@ -1,7 +1,8 @@
 #pragma once
 // "Selection Screen Entry" (dialog 8003): what goes to an instrument, before an upload. The
 // dialog only collects the choice: where the points come from, and by which ranges they and
-// their layers are chosen. Its caller makes it, shows it and reads the getters.
+// their layers are chosen. Its caller makes it, shows it and reads the getters;
+// UploadSelection::FromDialog applies the choice to the points of a job.
 //
 // The range getters put each pair in order first, in the dialog as well: texts compare case
 // by case as texts (so the point 9 comes after 10000), heights as numbers.

@@ -2,6 +2,8 @@
 // of the interface, BAD_WRONG_VERSION says it was built for another interface version, and
 // BAD_CRASH_ON_LOAD crashes and BAD_HANG_ON_LOAD hangs while the library is being opened.
 // The driver manager must refuse each by name and keep the good drivers beside it.
+// OLD_VERSION_ONE is no fault: a driver of version 1 of the interface, from before the
+// upload, which must still load.
 
 #include <unistd.h>
 
@@ -30,15 +32,21 @@ struct HangOnLoad {
 extern "C" {
 
 SXN_DRIVER_EXPORT unsigned sxn_driver_api_version(void) {
-#ifdef BAD_WRONG_VERSION
+#if defined(BAD_WRONG_VERSION)
     return SXN_DRIVER_API_VERSION + 1;
+#elif defined(OLD_VERSION_ONE)
+    return 1;
 #else
     return SXN_DRIVER_API_VERSION;
 #endif
 }
 
 SXN_DRIVER_EXPORT const char* sxn_driver_name(void) {
+#ifdef OLD_VERSION_ONE
+    return "Version One";
+#else
     return "Faulty";
+#endif
 }
 
 SXN_DRIVER_EXPORT const char* sxn_driver_description(void) {

@@ -14,7 +14,7 @@ no_station="sxnedit: The data hold observations before any station block; they a
 
 check instruments 0 "$here/expected/instruments.txt" "" -- "$sxnedit" instruments
 check instruments-usage 64 /dev/null "" -- "$sxnedit" instruments --all
-"$sxnedit" instruments --json | python3 -c 'import json, sys; d = json.load(sys.stdin); names = [x["name"] for x in d["drivers"]]; assert len(names) == 10 and "Carlson RW5" in names and d["drivers"][names.index("Leica GSI")]["extensions"] == ["gsi", "gs8", "gs16"] and d["refused"] == []' &&
+"$sxnedit" instruments --json | python3 -c 'import json, sys; d = json.load(sys.stdin); names = [x["name"] for x in d["drivers"]]; assert len(names) == 10 and "Carlson RW5" in names and d["drivers"][names.index("Leica GSI")]["extensions"] == ["gsi", "gs8", "gs16"] and [x["name"] for x in d["drivers"] if x["upload"]] == ["Leica GSI", "Neutral"] and d["refused"] == []' &&
     passed=$((passed + 1)) || { echo "FAIL instruments-json"; failed=$((failed + 1)); }
 
 check import-stdout 0 "$here/expected/rilievo-gon.neu" "$no_station" -- "$sxnedit" import "$raw/RILIEVO.gsi" --instrument "leica gsi" --angles gon
@@ -45,7 +45,8 @@ Usage: sxnedit download [OPTIONS]
 Run 'sxnedit download --help' for more information." -- "$sxnedit" download --instrument "Leica GSI"
 check download-bad-parity 64 /dev/null "" -- "$sxnedit" download --instrument "Leica GSI" --port COM1 --parity maybe
 
-# The RW5 traverse imported and reduced: its stations where the data collector put them.
+# The RW5 traverse imported and reduced, its stations where the data collector put them;
+# its route found and adjusted, the misclose against the closure the file records.
 python3 "$here/rw5_traverse.py" "$sxnedit" "$raw/Trav_19leg.rw5" "$work" &&
     passed=$((passed + 1)) || { echo "FAIL rw5-traverse"; failed=$((failed + 1)); }
 

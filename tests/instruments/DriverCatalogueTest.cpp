@@ -49,7 +49,8 @@ TEST_F(DriverDirectory, FaultyLibrariesAreRefusedByNameAndTheOthersStillLoad) {
     ASSERT_EQ(refused.size(), 5u);
     EXPECT_EQ(refused["missing_symbol.so"], "it lacks the function sxn_driver_translate");
     EXPECT_EQ(refused["wrong_version.so"],
-              "it was built for version 2 of the driver interface; this program takes version 1");
+              "it was built for version 3 of the driver interface; this program takes versions 1 "
+              "to 2");
     EXPECT_EQ(refused["crash_on_load.so"].substr(0, 35), "it crashed while loading (signal 11");
     EXPECT_EQ(refused["gsi_copy.so"],
               "a driver of the same name, Leica GSI, was taken from gsi.so");
@@ -88,6 +89,22 @@ TEST_F(DriverDirectory, TheManagerOffersTheGoodDriversAndLoadsThemByName) {
     }
     EXPECT_EQ(manager.GetEOF(), 1);
     EXPECT_EQ(manager.SetTranslateMode(), 0);
+}
+
+TEST_F(DriverDirectory, ADriverOfTheFirstVersionStillLoadsAndOnlyUploadersUpload) {
+    Link(kBadDrivers + "/version_one.so", "version_one.so");
+    const nedit::DriverCatalogue catalogue(dir.Path());
+    ASSERT_EQ(catalogue.Drivers().size(), 3u);
+    EXPECT_TRUE(catalogue.Drivers()[0].uploads);  // Leica GSI
+    EXPECT_TRUE(catalogue.Drivers()[1].uploads);  // Neutral
+    EXPECT_EQ(catalogue.Drivers()[2].name, L"Version One");
+    EXPECT_FALSE(catalogue.Drivers()[2].uploads);
+
+    UDeviceManager manager(L"", 0, false, dir.Path());
+    ASSERT_EQ(manager.LoadDLL(L"Version One"), 1);
+    EXPECT_FALSE(manager.CanUpload());
+    EXPECT_EQ(manager.StartUpload(SXN_MODE_METRES), 0);
+    EXPECT_EQ(manager.GetLastError(), L"The driver Version One cannot upload points.");
 }
 
 TEST(DriverCatalogue, AMissingDirectoryHoldsNoDrivers) {

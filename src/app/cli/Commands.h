@@ -28,3 +28,4 @@ void AddInstrumentsCommand(CLI::App& app, CommandRun& run);
 void AddImportCommand(CLI::App& app, CommandRun& run);
 void AddDownloadCommand(CLI::App& app, CommandRun& run);
 void AddExportCommand(CLI::App& app, CommandRun& run);
+void AddUploadCommand(CLI::App& app, CommandRun& run);

@@ -34,7 +34,8 @@ void PrintJson(const nedit::DriverCatalogue& drivers) {
         found.push_back({{"name", json::Text(driver.name)},
                          {"description", json::Text(driver.description)},
                          {"extensions", ExtensionList(driver.extensions)},
-                         {"file", driver.path}});
+                         {"file", driver.path},
+                         {"upload", driver.uploads}});
     }
     std::vector<json::Value> refused;
     for (const nedit::RefusedDriver& driver : drivers.Refused()) {
@@ -56,9 +57,10 @@ int ListInstruments(const InstrumentsOptions& options) {
         for (const nedit::DriverInfo& driver : drivers.Drivers())
             width = std::max(width, static_cast<int>(nedit::ToUtf8(driver.name).size()));
         for (const nedit::DriverInfo& driver : drivers.Drivers()) {
-            std::printf("%-*s %s (%s)\n", width, nedit::ToUtf8(driver.name).c_str(),
+            std::printf("%-*s %s (%s)%s\n", width, nedit::ToUtf8(driver.name).c_str(),
                         nedit::ToUtf8(driver.description).c_str(),
-                        nedit::ToUtf8(driver.extensions).c_str());
+                        nedit::ToUtf8(driver.extensions).c_str(),
+                        driver.uploads ? ", uploads points" : "");
         }
     }
     for (const nedit::RefusedDriver& refused : drivers.Refused()) {

@@ -106,18 +106,19 @@ int TransferTarget::Open(const TransferOptions& options) {
     if (options.angles >= 0) mode = (mode & ~7u) | (1u << options.angles);
     if (options.lengths >= 0) mode = (mode & ~56u) | (SXN_MODE_METRES << options.lengths);
     Document->SetImportMode(mode);
-    if (!Manager().LoadDLL(nedit::FromUtf8(options.instrument))) {
-        std::vector<std::wstring> names;
-        Manager().GetNameList(names);
-        std::wstring known;
-        for (const std::wstring& name : names) known += (known.empty() ? L"" : L", ") + name;
-        Error(nedit::ToUtf8(Manager().GetLastError()) + " The drivers are: " +
-              (known.empty() ? "none, in " + Manager().Catalogue().Directory()
-                             : nedit::ToUtf8(known)) +
-              ".");
-        return exit_status::Failed;
-    }
-    return exit_status::Ok;
+    return LoadDriver(Manager(), options.instrument);
+}
+
+int LoadDriver(UDeviceManager& manager, const std::string& instrument) {
+    if (manager.LoadDLL(nedit::FromUtf8(instrument))) return exit_status::Ok;
+    std::vector<std::wstring> names;
+    manager.GetNameList(names);
+    std::wstring known;
+    for (const std::wstring& name : names) known += (known.empty() ? L"" : L", ") + name;
+    Error(nedit::ToUtf8(manager.GetLastError()) + " The drivers are: " +
+          (known.empty() ? "none, in " + manager.Catalogue().Directory() : nedit::ToUtf8(known)) +
+          ".");
+    return exit_status::Failed;
 }
 
 int TransferTarget::Deliver(const TransferOptions& options, const std::string& verb,

@@ -40,6 +40,10 @@ void AddTransferOptions(CLI::App& command, TransferOptions& options);
 /// standard error, when an output may not be written.
 bool CheckTransferFiles(const TransferOptions& options, RunFiles files);
 
+/// Loads the driver of `instrument`; on failure says why and which drivers there are, and
+/// gives the exit status (0 when loaded).
+int LoadDriver(UDeviceManager& manager, const std::string& instrument);
+
 /// The document that receives the records, with its list and the console host.
 class TransferTarget {
   public:

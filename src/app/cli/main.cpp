@@ -75,6 +75,7 @@ int Run(int argc, char** argv) {
     AddImportCommand(app, run);
     AddDownloadCommand(app, run);
     AddExportCommand(app, run);
+    AddUploadCommand(app, run);
     app.footer(kFooter);  // after the commands, which would take it over
     try {
         app.parse(argc, argv);

@@ -193,13 +193,43 @@ long SerialPort::Write(const unsigned char* bytes, std::size_t size) {
     return -1;
 }
 
+long SerialPort::WriteAll(const unsigned char* bytes, std::size_t size, int wait_ms) {
+    std::size_t written = 0;
+    while (written < size) {
+        const long count = Write(bytes + written, size - written);
+        if (count < 0) return -1;
+        written += static_cast<std::size_t>(count);
+        if (written == size) break;
+        pollfd wait{fd_, POLLOUT, 0};
+        const int ready = poll(&wait, 1, wait_ms);
+        if (ready < 0 && errno == EINTR) continue;
+        if (ready <= 0 || (wait.revents & (POLLERR | POLLHUP)) != 0) {
+            Fail("The link on " + path_ + " took nothing for " + std::to_string(wait_ms / 1000) +
+                 " s.");
+            return -1;
+        }
+    }
+    return static_cast<long>(written);
+}
+
+bool SerialPort::Drain(int wait_ms) {
+    constexpr int kStepMs = 10;
+    for (int waited = 0; IsOpen(); waited += kStepMs) {
+        int pending = 0;
+        if (ioctl(fd_, TIOCOUTQ, &pending) != 0 || pending == 0) return true;
+        if (waited >= wait_ms) break;
+        usleep(kStepMs * 1000);
+    }
+    return Fail("What was written to " + path_ + " did not leave the port in time.");
+}
+
 bool SerialPort::Purge() {
     return IsOpen() && tcflush(fd_, TCIOFLUSH) == 0;
 }
 
 void SerialPort::Close() {
     if (!IsOpen()) return;
-    Purge();
+    tcflush(fd_, TCIFLUSH);
     close(fd_);
     fd_ = -1;
 }

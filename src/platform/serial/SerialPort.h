@@ -45,9 +45,17 @@ class SerialPort {
     long Read(unsigned char* bytes, std::size_t size, int wait_ms);
     /// Writes without waiting; gives the count taken, or -1.
     long Write(const unsigned char* bytes, std::size_t size);
+    /// Writes all of `bytes`, waiting up to `wait_ms` at a time for the link to take more (a
+    /// receiver that holds the flow back). Gives the count, or -1 (LastError() says why)
+    /// when the link fails or takes nothing for that long.
+    long WriteAll(const unsigned char* bytes, std::size_t size, int wait_ms);
+    /// Waits, up to `wait_ms`, until what was written has left the port. False, with
+    /// LastError(), when it has not left in time.
+    bool Drain(int wait_ms);
     /// Throws away what is waiting in both directions.
     bool Purge();
-    /// Purges and closes; nothing happens when the port is not open.
+    /// Throws away what came in and was not read, and closes; what was written still goes
+    /// out (an upload's last points). Nothing happens when the port is not open.
     void Close();
 
     const std::string& LastError() const { return error_; }

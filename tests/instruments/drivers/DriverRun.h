@@ -14,6 +14,8 @@
 #include <vector>
 
 #include "instruments/DriverCatalogue.h"
+#include "instruments/UploadSelection.h"
+#include "platform/text/WideText.h"
 
 /// The bytes of the raw file `name` of tests/data/raw.
 inline std::string RawFixture(const std::string& name) {
@@ -63,6 +65,27 @@ class DriverRun {
                     std::size_t chunk = 1 << 20) {
         return Run(bytes, chunk,
                    [&](const sxn_host* host) { return functions_.download(host, mode, flags); });
+    }
+
+    /// An upload of `points`: what the driver sent, and its messages. `answers` receives the
+    /// driver's answer for each point.
+    Result Upload(const std::vector<nedit::UploadPoint>& points, unsigned mode,
+                  std::vector<int>* answers = nullptr) {
+        Result result;
+        EXPECT_TRUE(functions_.CanUpload());
+        if (!functions_.CanUpload()) return result;
+        const sxn_host host{&result, &OnRecord, &OnMessage, &OnSend};
+        sxn_session* session = functions_.upload(&host, mode);
+        EXPECT_NE(session, nullptr);
+        if (session == nullptr) return result;
+        for (const nedit::UploadPoint& point : points) {
+            const int answer = functions_.uploadPoint(
+                session, nedit::ToUtf8(point.name).c_str(), nedit::ToUtf8(point.code).c_str(),
+                point.east, point.north, point.height, point.hasHeight ? 1 : 0);
+            if (answers != nullptr) answers->push_back(answer);
+        }
+        functions_.finish(session);
+        return result;
     }
 
     const nedit::DriverFunctions& Functions() const { return functions_; }
