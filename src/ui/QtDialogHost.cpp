@@ -17,9 +17,11 @@
 #include "ui/forms/GetNameForm.h"
 #include "ui/forms/GlobalEditForm.h"
 #include "ui/forms/LoadRawForm.h"
+#include "ui/forms/MiscloseReportForm.h"
 #include "ui/forms/ObjectInfoForm.h"
 #include "ui/forms/PortSettingsForm.h"
 #include "ui/forms/ReportParametersForm.h"
+#include "ui/forms/TraverseForm.h"
 #include "ui/forms/UploadSelectionForm.h"
 
 namespace nedit {
@@ -84,6 +86,8 @@ QtDialogHost::QtDialogHost(QWidget* parent) : parent_(parent) {
     SetForm<DownloadForm, UNEDownload>();
     SetForm<PortSettingsForm, USetComm>();
     SetForm<UploadSelectionForm, UUploadSource>();
+    SetForm<TraverseForm, USelRouteDlg>();
+    SetForm<MiscloseReportForm, UMisReportDlg>();
     // The raw file dialog ends with the button that ended it.
     SetFace<ULoadRawDlg>([this](ULoadRawDlg& dialog) {
         return ShowForm<LoadRawForm>(dialog) == mb::IdOk ? dialog.GetEndCode() : mb::IdCancel;
