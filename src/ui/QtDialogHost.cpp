@@ -11,6 +11,7 @@
 #include "ui/forms/CoordEntryForm.h"
 #include "ui/forms/DisplaySettingsForm.h"
 #include "ui/forms/DownloadForm.h"
+#include "ui/forms/DuplicatePointForm.h"
 #include "ui/forms/EditRecordForm.h"
 #include "ui/forms/FileDialogForm.h"
 #include "ui/forms/GenericForm.h"
@@ -19,6 +20,8 @@
 #include "ui/forms/LoadRawForm.h"
 #include "ui/forms/MiscloseReportForm.h"
 #include "ui/forms/ObjectInfoForm.h"
+#include "ui/forms/OverrideStringForm.h"
+#include "ui/forms/PointCodeForm.h"
 #include "ui/forms/PortSettingsForm.h"
 #include "ui/forms/ReportParametersForm.h"
 #include "ui/forms/TraverseForm.h"
@@ -99,6 +102,16 @@ QtDialogHost::QtDialogHost(QWidget* parent) : parent_(parent) {
             return mb::IdCancel;
         }
         return ExecForm(form) == QDialog::Accepted ? mb::IdOk : mb::IdCancel;
+    });
+    // The questions of a transfer: a point of the job with other coordinates ends with the
+    // code of the choice, a polyline of a string's name with Yes or No.
+    SetForm<PointCodeForm, UToSvyDlg>();
+    SetFace<DuplicatePtsDlg>([this](DuplicatePtsDlg& dialog) {
+        return ShowForm<DuplicatePointForm>(dialog) == mb::IdOk ? dialog.EndCode() : mb::IdCancel;
+    });
+    SetFace<UOverridePolyDlg>([this](UOverridePolyDlg& dialog) {
+        ShowForm<OverrideStringForm>(dialog);
+        return dialog.Answer;
     });
     // The locked layers before a transfer are a question with OK and Cancel.
     SetFace<LockedLayersQuestion>([this](LockedLayersQuestion& question) {
