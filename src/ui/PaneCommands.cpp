@@ -411,7 +411,8 @@ void CNeditViewPane::OnNeditTraverse() {
     RowEditStep step(Recorder, tr("Traverse Adjustment"));
     MarkModified();
     Document->Save(ListCtrl, 0);
-    GraphView->ResetSelectedLine();
+    // The side shots were reduced again from the adjusted stations: the plan reads them anew.
+    GraphView->DatabaseReplaced();
     GraphView->ResetExtents();
 }
 
