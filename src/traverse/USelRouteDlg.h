@@ -106,6 +106,8 @@ class USelRouteDlg : public nedit::UDialogLogic, public TraverseParams {
 
     // ---- What it shows --------------------------------------------------------------------
     int GetDialogId() const { return DialogId; }
+    /// The reduced data the routes run through.
+    const UNeditDatabase* GetDatabase() const { return Db; }
     const std::vector<RouteRow>& GetRouteRows() const { return RouteRows; }
     int GetSelectedRow() const { return SelectedRow; }
     const nedit::NameList* GetRouteSel() const { return RouteSel; }

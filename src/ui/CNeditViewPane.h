@@ -170,6 +170,9 @@ class CNeditViewPane : public QWidget, private UTransferView {
     /// writes the stores into the job and tells the job's views to show all of it.
     void OnNeditTransfer();
     void OnNeditViewReport();
+    /// "Traverse Adjustment": the route dialog on the document's last run; after an
+    /// adjustment the document is modified and its adjusted points saved into the rows.
+    void OnNeditTraverse();
     void OnNeditDelAdjpts();
     void OnDisplaySettings();
     void OnEditRecordData(const QString& text, int row);

@@ -177,7 +177,8 @@ std::vector<CommandInfo> MakeCommands() {
         Command(DisplaySettings, kView, "Display Settings...", kAlways,
                 "Choose the labels and text size of the plan"),
 
-        Unbuilt(Command(Traverse, kTools, "Traverse Adjustment", kIdle, "")),
+        Command(Traverse, kTools, "Traverse Adjustment", kIdle,
+                "Choose a traverse route, compute its misclose and adjust it"),
         Command(DelAdjpts, kTools, "Delete Adjusted Pts", kIdle,
                 "Delete the adjusted points from the records"),
         // The port settings have no menu of their own in the raw-data window; the desktop

@@ -17,6 +17,7 @@
 #include "exports/UExportDlg.h"
 #include "instruments/PortStores.h"
 #include "instruments/USetComm.h"
+#include "platform/job/UJobSettings.h"
 #include "platform/job/USurveyDoc.h"
 #include "platform/messages/Translate.h"
 #include "platform/settings/IniFile.h"
@@ -25,6 +26,8 @@
 #include "reduction/UNeditDatabase.h"
 #include "report/UNeditReport.h"
 #include "report/UOutputParamDlg.h"
+#include "traverse/TraverseRoutes.h"
+#include "traverse/USelRouteDlg.h"
 #include "ui/CNeditViewPane.h"
 #include "ui/CommandIds.h"
 #include "ui/CommandTable.h"
@@ -166,6 +169,9 @@ bool CNeditViewPane::OnCommand(int id) {
             break;
         case cmd::ViewReport:
             OnNeditViewReport();
+            break;
+        case cmd::Traverse:
+            OnNeditTraverse();
             break;
         case cmd::DelAdjpts:
             OnNeditDelAdjpts();
@@ -405,6 +411,30 @@ void CNeditViewPane::OnCommentRecord() {
 void CNeditViewPane::OnNeditOutputparam() {
     UOutputParamDlg dialog(Document->GetOutputParameters());
     if (Host->Run(dialog) == mb::IdOk) Document->GetOutputParameters() = dialog.GetParameters();
+}
+
+void CNeditViewPane::OnNeditTraverse() {
+    Instruments->StopDownload();
+    UNeditDatabase* engine = Document->GetDatabase();
+    if (engine == nullptr) return;
+    TraverseRoutes& routes = Document->GetTraverseRoutes();
+    if (routes.GetTraverseList().empty()) {
+        AppMessageBox(Host, Translate(L"No traverse route exists."), mb::Ok);
+        return;
+    }
+    const bool north_first =
+        Document->GetSettings().GetCoordinateOrder() == UJobSettings::kNorthEast;
+    USelRouteDlg dialog(engine, &routes,
+                        north_first ? USelRouteDlg::kNorthFirstId : USelRouteDlg::kEastFirstId,
+                        nullptr);
+    if (Host->Run(dialog) != mb::IdOk) return;
+    // The points behind the adjusted-points line are saved; the plan shows the adjustment.
+    RowEditStep step(Recorder, tr("Traverse Adjustment"));
+    MarkModified();
+    Document->Save(ListCtrl, 0);
+    // The side shots were reduced again from the adjusted stations: the plan reads them anew.
+    GraphView->DatabaseReplaced();
+    GraphView->ResetExtents();
 }
 
 void CNeditViewPane::OnNeditDelAdjpts() {

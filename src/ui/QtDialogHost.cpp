@@ -11,6 +11,7 @@
 #include "ui/forms/CoordEntryForm.h"
 #include "ui/forms/DisplaySettingsForm.h"
 #include "ui/forms/DownloadForm.h"
+#include "ui/forms/DuplicatePointForm.h"
 #include "ui/forms/EditRecordForm.h"
 #include "ui/forms/ExportForm.h"
 #include "ui/forms/FileDialogForm.h"
@@ -18,9 +19,13 @@
 #include "ui/forms/GetNameForm.h"
 #include "ui/forms/GlobalEditForm.h"
 #include "ui/forms/LoadRawForm.h"
+#include "ui/forms/MiscloseReportForm.h"
 #include "ui/forms/ObjectInfoForm.h"
+#include "ui/forms/OverrideStringForm.h"
+#include "ui/forms/PointCodeForm.h"
 #include "ui/forms/PortSettingsForm.h"
 #include "ui/forms/ReportParametersForm.h"
+#include "ui/forms/TraverseForm.h"
 #include "ui/forms/UploadSelectionForm.h"
 
 namespace nedit {
@@ -86,6 +91,8 @@ QtDialogHost::QtDialogHost(QWidget* parent) : parent_(parent) {
     SetForm<PortSettingsForm, USetComm>();
     SetForm<UploadSelectionForm, UUploadSource>();
     SetForm<ExportForm, UExportDlg>();
+    SetForm<TraverseForm, USelRouteDlg>();
+    SetForm<MiscloseReportForm, UMisReportDlg>();
     // The raw file dialog ends with the button that ended it.
     SetFace<ULoadRawDlg>([this](ULoadRawDlg& dialog) {
         return ShowForm<LoadRawForm>(dialog) == mb::IdOk ? dialog.GetEndCode() : mb::IdCancel;
@@ -97,6 +104,16 @@ QtDialogHost::QtDialogHost(QWidget* parent) : parent_(parent) {
             return mb::IdCancel;
         }
         return ExecForm(form) == QDialog::Accepted ? mb::IdOk : mb::IdCancel;
+    });
+    // The questions of a transfer: a point of the job with other coordinates ends with the
+    // code of the choice, a polyline of a string's name with Yes or No.
+    SetForm<PointCodeForm, UToSvyDlg>();
+    SetFace<DuplicatePtsDlg>([this](DuplicatePtsDlg& dialog) {
+        return ShowForm<DuplicatePointForm>(dialog) == mb::IdOk ? dialog.EndCode() : mb::IdCancel;
+    });
+    SetFace<UOverridePolyDlg>([this](UOverridePolyDlg& dialog) {
+        ShowForm<OverrideStringForm>(dialog);
+        return dialog.Answer;
     });
     // The locked layers before a transfer are a question with OK and Cancel.
     SetFace<LockedLayersQuestion>([this](LockedLayersQuestion& question) {

@@ -13,9 +13,6 @@ constexpr double kExtent = 32000.0;
 constexpr double kOrigin = -1000.0;
 constexpr double kReach = 30000.0;
 constexpr double kWidePen = 300.0;
-constexpr double kRing = 150.0;
-constexpr double kTextGap = 200.0;
-constexpr double kTextLimit = 31000.0;
 
 }  // namespace
 
@@ -95,23 +92,38 @@ void SXTView::paintEvent(QPaintEvent* /*event*/) {
         draw_route(route, entries);
     }
     painter.setPen(QPen(Qt::red, kWidePen, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
-    draw_route(Routes, ChosenPart());
+    const std::vector<std::size_t> chosen = ChosenPart();
+    draw_route(Routes, chosen);
+    // Rings and names keep their size on the screen whatever the view's: so many pixels.
+    const double pixel = kExtent / side;
+    QFont font = painter.font();
+    font.setPixelSize(static_cast<int>(11.0 * pixel));
+    painter.setFont(font);
+    const QFontMetricsF metrics(font);
+    const auto label = [&](const std::wstring& name, const QColor& colour) {
+        QPointF at;
+        if (!Plot(name, at)) return;
+        const QString text = QString::fromStdWString(name);
+        // Upright, to the upper right of the point, and pulled back inside the view.
+        const double x = std::min(at.x() + 4.0 * pixel,
+                                  kExtent + kOrigin - metrics.horizontalAdvance(text) - pixel);
+        const double y = std::clamp(at.y() + 3.0 * pixel, kOrigin + metrics.descent(),
+                                    kExtent + kOrigin - metrics.ascent());
+        painter.save();
+        painter.translate(x, y);
+        painter.scale(1.0, -1.0);
+        painter.setPen(colour);
+        painter.drawText(QPointF(0.0, 0.0), text);
+        painter.restore();
+    };
+    for (const std::size_t entry : chosen) label(Routes[entry], Qt::darkGray);
     if (StartName.empty() || EndName.empty()) return;
-    painter.setPen(QPen(Qt::blue, kWidePen));
+    painter.setPen(QPen(Qt::blue, 2.0 * pixel));
     for (const std::wstring& name : {StartName, EndName}) {
         QPointF at;
         if (!Plot(name, at)) continue;
-        painter.drawEllipse(at, kRing, kRing);
-        // Names are written upright, pulled back from the edge so that they stay inside.
-        painter.save();
-        painter.translate(std::min(at.x() + kTextGap, kTextLimit), std::min(at.y(), kTextLimit));
-        painter.scale(1.0, -1.0);
-        QFont font = painter.font();
-        font.setPixelSize(900);
-        painter.setFont(font);
-        painter.drawText(QPointF(0, QFontMetricsF(font).height() / 4.0),
-                         QString::fromStdWString(name));
-        painter.restore();
+        painter.drawEllipse(at, 4.0 * pixel, 4.0 * pixel);
+        label(name, Qt::blue);
     }
 }
 

@@ -1,8 +1,8 @@
 #pragma once
 // The small plan of the route selection: every route of the run in black, the chosen part
-// of the route in hand in red from its start to its end, and the start and end points
-// ringed in blue with their names. It draws in a square of 32000 units over the extents of
-// the survey, so its picture does not depend on the window's size.
+// of the route in hand in red from its start to its end with the names of its points, and
+// the start and end points ringed in blue with their names in blue. It draws in a square of 32000
+// units over the extents of the survey, so its picture does not depend on the window's size.
 
 #include <QWidget>
 #include <string>

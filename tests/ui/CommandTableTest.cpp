@@ -77,7 +77,7 @@ void CommandTableTest::menuTexts_data() {
     row(cmd::Regenerate, "View", "Regenerate View", true);
     row(cmd::ViewReport, "View", "Report", true);
     row(cmd::ActivateSurveyView, "View", "Survey", false);
-    row(cmd::Traverse, "Tools", "Traverse Adjustment", false);
+    row(cmd::Traverse, "Tools", "Traverse Adjustment", true);
     row(cmd::DelAdjpts, "Tools", "Delete Adjusted Pts", true);
     row(cmd::Setcomm, "Tools", "Port Settings...", true);
     row(cmd::SurveyCode, "Library", "Survey Codes", false);

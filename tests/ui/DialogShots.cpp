@@ -1,6 +1,7 @@
 // Takes the README's pictures of the desktop's dialogs, on the bundled example: the record
-// dialog, the global edit, the download parameters and a download under way (a fake
-// instrument playing a GSI file down a pseudo-terminal). Run by scripts/screenshot-dialogs
+// dialog, the global edit, the traverse dialog and its misclose report, the download
+// parameters and a download under way (a fake instrument playing a GSI file down a
+// pseudo-terminal). Run by scripts/screenshot-dialogs
 // under a virtual X server; not a test. Usage: ui_dialog_shots OUT_DIRECTORY
 
 #include <QApplication>
@@ -26,6 +27,8 @@
 #include "ui/forms/DownloadForm.h"
 #include "ui/forms/DownloadProgressWindow.h"
 #include "ui/forms/GlobalEditForm.h"
+#include "ui/forms/MiscloseReportForm.h"
+#include "ui/forms/TraverseForm.h"
 #include "ui/forms/UEdit.h"
 
 using namespace nedit;
@@ -85,6 +88,26 @@ void GlobalEdit() {
     example.Window().RunCommand(cmd::GlobalEdit);
 }
 
+void Traverse() {
+    ExampleWindow example([](ScriptedHost& host) {
+        host.SetFormScript(QStringLiteral("Traverse Adjustment"), [](QDialog& dialog) {
+            auto& form = static_cast<TraverseForm&>(dialog);
+            test::ChooseExampleLoop(form);
+            Photograph(form, QStringLiteral("traverse-dialog.png"));
+            form.accept();  // Compute
+            return form.result();
+        });
+        host.SetFormScript(QStringLiteral("Traverse Misclose Report"), [](QDialog& dialog) {
+            auto& form = static_cast<MiscloseReportForm&>(dialog);
+            Photograph(form, QStringLiteral("misclose-dialog.png"));
+            form.CoordinatesButton()->click();
+            form.accept();
+            return form.result();
+        });
+    });
+    example.Window().RunCommand(cmd::Traverse);
+}
+
 void Download() {
     FakeInstrument instrument;
     QFile raw(QStringLiteral(SXNEDIT_TEST_DATA "/raw/RILIEVO.gsi"));
@@ -135,6 +158,7 @@ int main(int argc, char* argv[]) {
     qputenv("TMPDIR", temporary.path().toUtf8());
     RecordDialog();
     GlobalEdit();
+    Traverse();
     Download();
     return 0;
 }

@@ -74,6 +74,20 @@ void DlgMakerTest::lengthsShowTheJobsUnitAndFollowTheirMember() {
     maker.UpdateData(false);
     QCOMPARE(field->text(), QStringLiteral("0.33"));
     QCOMPARE(changes, 3);
+    // The control being typed in keeps the user's text; the others show their members. A
+    // change names its control.
+    QObject* changed = nullptr;
+    connect(&maker, &UDlgMaker::changed, &form,
+            [&changed](QObject* control) { changed = control; });
+    field->setText(QStringLiteral("7."));
+    QCOMPARE(changed, field);
+    elevation = -0.0001;  // shows as zero, without a minus
+    maker.UpdateData(false, field);
+    QCOMPARE(field->text(), QStringLiteral("7."));
+    QCOMPARE(level->text(), QStringLiteral("0.00"));
+    UEdit* area = maker.Edit("AREA", height);
+    QCOMPARE(area->text(), QStringLiteral("7.00"));
+    QCOMPARE(area->Unit(), QStringLiteral("ft\u00b2"));
 }
 
 void DlgMakerTest::anUntouchedNumberKeepsItsPlaces() {

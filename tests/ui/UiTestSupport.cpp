@@ -4,6 +4,7 @@
 #include <QComboBox>
 #include <QDialog>
 #include <QFile>
+#include <QListWidget>
 #include <QMessageBox>
 #include <QPushButton>
 #include <QTest>
@@ -13,6 +14,8 @@
 #include "ui/UNeditGraphView.h"
 #include "ui/UNeditView.h"
 #include "ui/forms/DownloadForm.h"
+#include "ui/forms/TraverseForm.h"
+#include "ui/forms/UEdit.h"
 
 namespace nedit::test {
 
@@ -28,6 +31,22 @@ void ChooseGsiOnCom1(DownloadForm& form) {
     form.List(UNEDownload::kInstrumentList)->setCurrentText(QStringLiteral("Leica GSI"));
     form.List(UNEDownload::kPortList)->setCurrentText(QStringLiteral("COM1"));
     form.SaveRawBox()->setChecked(false);
+}
+
+void ChooseExampleLoop(TraverseForm& form) {
+    const QList<QListWidgetItem*> loop =
+        form.Routes()->findItems(QStringLiteral("A,B,C,D,A,"), Qt::MatchExactly);
+    if (!loop.isEmpty()) form.Routes()->setCurrentItem(loop.front());
+    for (const auto& [id, value] : {std::pair{TraverseForm::kStartXField, "1000.000"},
+                                    std::pair{TraverseForm::kStartYField, "2000.000"},
+                                    std::pair{TraverseForm::kStartZField, "50.000"},
+                                    std::pair{USelRouteDlg::kFixedXField, "1000.000"},
+                                    std::pair{USelRouteDlg::kFixedYField, "2000.000"},
+                                    std::pair{USelRouteDlg::kFixedZField, "50.000"}}) {
+        UEdit* field = form.Field(id);
+        field->selectAll();
+        QTest::keyClicks(field, QString::fromLatin1(value));
+    }
 }
 
 int ScriptedHost::ExecForm(QDialog& form) {

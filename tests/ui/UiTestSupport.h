@@ -21,6 +21,7 @@ class QMessageBox;
 namespace nedit {
 class CNeditViewPane;
 class DownloadForm;
+class TraverseForm;
 class UNeditGraphView;
 }  // namespace nedit
 
@@ -43,6 +44,10 @@ QString ExampleFile();
 
 /// Fills "Download Parameters" for a fake instrument on COM1: Leica GSI, no raw file kept.
 void ChooseGsiOnCom1(DownloadForm& form);
+
+/// Chooses the example's loop A,B,C,D,A in "Traverse Adjustment" and types A's known place
+/// (1000, 2000, 50) as its start and its fixed point, as a user closing the loop would.
+void ChooseExampleLoop(TraverseForm& form);
 
 /// A host that shows nothing: message boxes take queued answers (else their default
 /// button), forms are filled by a script for their dialog name (else accepted as they are).

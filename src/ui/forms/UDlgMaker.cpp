@@ -38,6 +38,7 @@ UEdit::Kind UDlgMaker::KindOf(std::string_view definition) {
         {"DISTANCE", UEdit::Kind::Distance},
         {"COORDINATE", UEdit::Kind::Coordinate},
         {"ELEVATION", UEdit::Kind::Elevation},
+        {"AREA", UEdit::Kind::Area},
     };
     const std::string_view word = TypeWord(definition);
     for (const auto& [name, kind] : kinds) {
@@ -52,10 +53,10 @@ void UDlgMaker::Bind(Control* control, Signal signal, Link link) {
     link.load();
     loading_ = false;
     const std::function<void()> store = link.store;
-    connect(control, signal, this, [this, store] {
+    connect(control, signal, this, [this, store, control] {
         if (loading_) return;
         store();
-        emit changed();
+        emit changed(control);
     });
     links_.push_back(std::move(link));
 }
@@ -73,7 +74,7 @@ UEdit* UDlgMaker::MakeEdit(std::string_view definition, bool number) {
 UEdit* UDlgMaker::Edit(std::string_view definition, std::wstring& value) {
     UEdit* edit = MakeEdit(definition, false);
     Bind(edit, &QLineEdit::textChanged,
-         {[edit, &value] { edit->setText(QString::fromStdWString(value)); },
+         {edit, [edit, &value] { edit->setText(QString::fromStdWString(value)); },
           [edit, &value] { value = Trim(edit->text().toStdWString()); }});
     return edit;
 }
@@ -98,7 +99,8 @@ UEdit* UDlgMaker::Edit(std::string_view definition, std::function<double()> get,
         if (!loading_) *edited = true;
     });
     Bind(edit, &QLineEdit::textChanged,
-         {[edit, get, edited] {
+         {edit,
+          [edit, get, edited] {
               edit->SetValue(get());
               *edited = false;
           },
@@ -116,7 +118,8 @@ QComboBox* UDlgMaker::List(std::string_view definition, std::wstring& value,
     box->setEditable(editable);
     for (const std::wstring& item : items) box->addItem(QString::fromStdWString(item));
     Bind(box, &QComboBox::currentTextChanged,
-         {[box, &value] {
+         {box,
+          [box, &value] {
               const QString text = QString::fromStdWString(value);
               const int index = box->findText(text, Qt::MatchFixedString);
               box->setCurrentIndex(index);
@@ -144,7 +147,7 @@ QCheckBox* UDlgMaker::Check(std::string_view definition, const QString& text,
                                     std::string(definition));
     auto* box = new QCheckBox(text, form_);
     Bind(box, &QCheckBox::toggled,
-         {[box, get] { box->setChecked(get()); }, [box, set] { set(box->isChecked()); }});
+         {box, [box, get] { box->setChecked(get()); }, [box, set] { set(box->isChecked()); }});
     return box;
 }
 
@@ -163,7 +166,8 @@ QButtonGroup* UDlgMaker::Radio(std::string_view definition, std::function<int()>
     auto* group = new QButtonGroup(form_);
     for (const auto& [id, text] : choices) group->addButton(new QRadioButton(text, form_), id);
     Bind(group, &QButtonGroup::idToggled,
-         {[group, get] {
+         {group,
+          [group, get] {
               if (QAbstractButton* button = group->button(get())) button->setChecked(true);
           },
           [group, set] {
@@ -179,9 +183,15 @@ QGroupBox* UDlgMaker::RadioBox(const QString& title, QButtonGroup* group, QWidge
     return box;
 }
 
-void UDlgMaker::UpdateData(bool save) {
+void UDlgMaker::UpdateData(bool save, const QObject* except) {
     loading_ = !save;
-    for (const Link& link : links_) (save ? link.store : link.load)();
+    for (const Link& link : links_) {
+        if (save) {
+            link.store();
+        } else if (link.control != except) {
+            link.load();
+        }
+    }
     loading_ = false;
 }
 

@@ -2,7 +2,7 @@
 // The binding of a form's controls to the members of its dialog logic object, by the link
 // texts the system's dialogs have always been described with: a type word and, after
 // commas, its parameters ("TEXT", "TEXT,COM2", "CHECK,1", "RADIO,1,", "LONG", "DOUBLE",
-// "LENGTH", "DISTANCE", "COORDINATE", "ELEVATION", "ANGLE", "VANGLE", "BEARING",
+// "LENGTH", "DISTANCE", "COORDINATE", "ELEVATION", "AREA", "ANGLE", "VANGLE", "BEARING",
 // "POINTCODE", "POINTNAME,NEDT,,4"). The type word picks the control and how its value is
 // read and shown (UEdit); every form makes its controls here, so they all behave alike.
 //
@@ -75,17 +75,19 @@ class UDlgMaker : public QObject {
     /// A box titled `title` with the buttons of a radio group one under the other.
     static QGroupBox* RadioBox(const QString& title, QButtonGroup* group, QWidget* parent);
 
-    /// With `save`, every control's value goes to its member; else every member is shown.
-    void UpdateData(bool save);
+    /// With `save`, every control's value goes to its member; else every member is shown,
+    /// but in `except`: the control being typed in keeps its text as the user has it.
+    void UpdateData(bool save, const QObject* except = nullptr);
 
     QWidget* Form() const { return form_; }
 
   signals:
-    /// The user changed a control; its member holds the new value.
-    void changed();
+    /// The user changed `control`; its member holds the new value.
+    void changed(QObject* control);
 
   private:
     struct Link {
+        const QObject* control;
         std::function<void()> load;
         std::function<void()> store;
     };

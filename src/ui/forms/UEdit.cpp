@@ -70,13 +70,14 @@ QString UEdit::Unit() const {
         }
     }
     if (IsLength()) {
+        const QString square = kind_ == Kind::Area ? QStringLiteral("\u00b2") : QString();
         switch (job_ != nullptr ? job_->GetLengthUnit() : LengthUnit::Metres) {
             case LengthUnit::Feet:
-                return QStringLiteral("ft");
+                return QStringLiteral("ft") + square;
             case LengthUnit::USFeet:
-                return QStringLiteral("usft");
+                return QStringLiteral("usft") + square;
             default:
-                return QStringLiteral("m");
+                return QStringLiteral("m") + square;
         }
     }
     return {};
@@ -96,7 +97,10 @@ void UEdit::SetValue(double value) {
     } else if (IsLength()) {
         const int decimals =
             std::max(job_ != nullptr ? job_->GetLengthDecimals() : 3, minimum_decimals_);
-        setText(QString::number(value, 'f', decimals));
+        QString text = QString::number(value, 'f', decimals);
+        // A value that shows as zero shows without a minus.
+        if (text.startsWith(QLatin1Char('-')) && text.toDouble() == 0.0) text.remove(0, 1);
+        setText(text);
     } else {
         setText(QString::fromStdWString(DoubleToText(value)));
     }

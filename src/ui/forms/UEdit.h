@@ -8,7 +8,8 @@
 //
 // The kinds are the field controls the system has always had: plain text, a point name, a
 // point code, a whole number, a real number, a horizontal angle, a vertical angle (shown as a
-// zenith angle), a bearing, and the lengths (length, distance, coordinate, elevation).
+// zenith angle), a bearing, the lengths (length, distance, coordinate, elevation), and an
+// area, shown with the lengths' decimals in the square of their unit.
 // Values go in and out in the program's units: degrees, and the job's length unit.
 //
 // Decisions:
@@ -40,6 +41,7 @@ class UEdit : public QLineEdit {
         Distance,
         Coordinate,
         Elevation,
+        Area,
     };
 
     /// A field of `kind` in the units of `job` (null: metres, ddd.mmss, 3 and 4 decimals).
@@ -52,14 +54,15 @@ class UEdit : public QLineEdit {
     /// The angle unit shown and typed: the job's unless set.
     AngleUnit GetAngleUnit() const { return angle_unit_; }
     void SetAngleUnit(AngleUnit unit);
-    /// The unit written beside the value: "m", "ft", "usft", "dms", "deg", "gon"; empty for
-    /// text and plain numbers.
+    /// The unit written beside the value: "m", "ft", "usft", "dms", "deg", "gon", and for an
+    /// area "m²", "ft²", "usft²"; empty for text and plain numbers.
     QString Unit() const;
 
     /// SetValue shows at least this many places (a record's own value shows all it holds).
     void SetMinimumDecimals(int decimals) { minimum_decimals_ = decimals; }
     /// Shows `value`: degrees in the angle unit (a bearing brought into 0 to 360), a length
-    /// as it is, with the job's decimals; an elevation of no height as an empty field.
+    /// as it is, with the job's decimals (one that rounds to zero without a minus); an
+    /// elevation of no height as an empty field.
     void SetValue(double value);
     /// The value typed, in degrees or the job's length unit; an empty field gives 0, or no
     /// height for an elevation.
