@@ -86,18 +86,12 @@ bool TraverseRoutes::FillSetUps(const UNeditDatabase& engine, const RunRows& rec
             if (type != rec::Bkb && type != rec::Bs && type != rec::Ss && type != rec::Ss2)
                 continue;
             if (!Format.ProcessRecord(type, records[row], Fields)) continue;
+            // Back sights are read for the values they leave current, and kept no further.
+            if (type == rec::Bkb || type == rec::Bs) continue;
             const std::wstring& name = Value(fld::ID);
             if (name.empty()) continue;
             const int at = static_cast<int>(row);
-            if (type == rec::Bkb) {
-                node.AddBKB(name, at);
-                continue;
-            }
-            if (type == rec::Bs) {
-                node.AddBS(name, at);
-                continue;
-            }
-            node.AddSS(name, at);
+            node.AddShot(ShotNames.Intern(ToUpper(name)), at);
             // The first character does not count: a code that begins with the check
             // command leaves the shot an edge.
             const std::wstring& code = Value(fld::CO);
@@ -251,6 +245,7 @@ void TraverseRoutes::ClearTraverseList() {
     TraverseList.Clear();
     TraverseBinList.clear();
     StnMap.clear();
+    ShotNames = NameTable();
 }
 
 void TraverseRoutes::SaveTraverseLines(UNeditDatabase& engine) const {
@@ -276,9 +271,11 @@ int TraverseRoutes::IsPtObserved(const std::wstring& name, int row,
                                  const std::wstring& target) const {
     const auto found = StnMap.find(name);
     if (found == StnMap.end()) return -1;
+    const NameTable::Id key = ShotNames.Find(ToUpper(target));
+    if (key == NameTable::kNone) return -1;
     for (const auto& node : found->second) {
-        for (const NameEntry& shot : node->GetSSList()) {
-            if (shot.Value > row && EqualsIgnoreCase(shot.Key, target)) return shot.Value;
+        for (const ShotEntry& shot : node->GetShots()) {
+            if (shot.Row > row && shot.Target == key) return shot.Row;
         }
     }
     return -1;

@@ -20,6 +20,7 @@
 #include <unordered_set>
 #include <vector>
 
+#include "platform/text/NameTable.h"
 #include "records/FieldMap.h"
 #include "reduction/RunRows.h"
 #include "reduction/RunStage.h"
@@ -105,6 +106,9 @@ class TraverseRoutes : public RunStage {
     std::vector<std::unique_ptr<NameList>> TraverseBinList;
     // Every set-up of a name, in row order.
     std::unordered_map<std::wstring, std::vector<std::unique_ptr<UNeditStn>>> StnMap;
+    // The targets of the set-ups' side shots, upper-cased, so that a name compares without
+    // regard to case by its number.
+    NameTable ShotNames;
 };
 
 }  // namespace nedit

@@ -4,8 +4,18 @@
 
 #include <string>
 #include <utility>
+#include <vector>
 
+#include "platform/text/NameTable.h"
 #include "traverse/NameList.h"
+
+/// A side-shot record of a set-up: its target, as the number of the target's upper-cased name
+/// in the search's table of side-shot names, and its row. A survey has millions of them, so
+/// each is two numbers rather than a copy of the name.
+struct ShotEntry {
+    nedit::NameTable::Id Target = nedit::NameTable::kNone;
+    int Row = 0;
+};
 
 class UNeditStn {
   public:
@@ -17,21 +27,15 @@ class UNeditStn {
     /// Observations of this set-up that lead to another occupied station: the edges.
     const nedit::NameList& GetStnList() const { return StnList; }
     /// Every side-shot record of the set-up, edge or not.
-    const nedit::NameList& GetSSList() const { return SSList; }
-    const nedit::NameList& GetBSList() const { return BSList; }
-    const nedit::NameList& GetBKBList() const { return BKBList; }
+    const std::vector<ShotEntry>& GetShots() const { return Shots; }
 
-    // Pairs are appended as they come; a name observed twice stands twice.
+    // Entries are appended as they come; a name observed twice stands twice.
     void AddStn(const std::wstring& name, int row) { StnList.push_back({name, row}); }
-    void AddSS(const std::wstring& name, int row) { SSList.push_back({name, row}); }
-    void AddBS(const std::wstring& name, int row) { BSList.push_back({name, row}); }
-    void AddBKB(const std::wstring& name, int row) { BKBList.push_back({name, row}); }
+    void AddShot(nedit::NameTable::Id target, int row) { Shots.push_back({target, row}); }
 
   private:
     std::wstring StnName;
     int Index;
     nedit::NameList StnList;
-    nedit::NameList SSList;
-    nedit::NameList BSList;
-    nedit::NameList BKBList;
+    std::vector<ShotEntry> Shots;
 };

@@ -55,6 +55,11 @@ TEST_F(RouteSurvey, TwoLoopsASpurAndAReoccupiedStation) {
     }
     EXPECT_EQ(routes.IsPtObserved(L"C", 8, L"s"), 13);
     EXPECT_EQ(routes.IsPtObserved(L"C", 13, L"S"), -1);
+    // Only side shots count: C's back sight of B does not, though A and F shoot B. A name
+    // occupied twice looks in both set-ups; a name nothing shot is observed by none.
+    EXPECT_EQ(routes.IsPtObserved(L"C", 8, L"b"), -1);
+    EXPECT_EQ(routes.IsPtObserved(L"B", 4, L"e"), 20);
+    EXPECT_EQ(routes.IsPtObserved(L"A", 0, L"Q"), -1);
 }
 
 TEST_F(RouteSurvey, ASetUpSightingAnotherPointThanTheRouteIsRefused) {
