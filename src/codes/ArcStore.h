@@ -23,6 +23,8 @@ class ArcStore {
     void Clear() { Arcs.clear(); }
 
     const std::vector<UNeditArc>& Items() const { return Arcs; }
+    /// The arc at an index the store holds, to set its look.
+    UNeditArc& At(std::size_t index) { return Arcs[index]; }
 
   private:
     std::vector<UNeditArc> Arcs;

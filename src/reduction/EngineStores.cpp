@@ -40,6 +40,7 @@ unsigned UNeditDatabase::SavePointOf(NameId name, double x, double y, double z,
         PointOfName[name] = static_cast<std::int32_t>(index);
     }
     if (TravFlag) SaveTravPoint(id, x, y, z, point_code ? *point_code : std::wstring(), 0);
+    ProcessCircle(index, point_code ? *point_code : std::wstring());
     return index;
 }
 

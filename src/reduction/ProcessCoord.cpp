@@ -61,6 +61,7 @@ bool UNeditDatabase::IsSelfObservation(const STNSTRUCT& station, const SSSTRUCT&
 
 void UNeditDatabase::ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target,
                                   const StationWork& work, double& e, double& n, double& z) const {
+    Process_Code_Offsets(target);
     const double zenith = target.VAng * kRadiansPerDegree;
     const double horizontal = std::sin(zenith) * target.SDist + PrismConst;
     const double vertical = std::cos(zenith) * target.SDist;
@@ -88,6 +89,10 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
     for (const STNSTRUCT& station : Setups)
         work.Steps += station.SSList.size() + station.FSList.size();
     if (work.Steps == 0) work.Steps = 1;
+
+    Strings.DeleteStrNoList();
+    CodeNotices.clear();
+    ResetCircleData();
 
     const bool printing = Report != nullptr && report == 1;
     if (printing) PrintRunHead();
@@ -142,6 +147,7 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
             if (stored >= 0.0) work.BackBearing = stored;
         }
 
+        ArrangePtNames(station.PtNames.begin(), station.PtNames.end());
         work.HasShots = HaveSideshotsToReport(&station, records);
         work.HeadPrinted = false;
         // A side-shot pass alone (after an adjustment) prints only stations with shots.
@@ -156,8 +162,14 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
             aborted = true;
         }
     }
+    Strings.ProcessOffsetStringPoints();
+    if (CurPtNames) ArrangePtNames(CurPtNames->data(), CurPtNames->data() + CurPtNames->size());
     UpdateProgress(100, L"");
-    return aborted ? 0 : 1;
+    if (printing) PrintUnDefineCode();
+    if (aborted) return 0;
+    ProcessString();
+    ShowCodeNotices(printing);
+    return 1;
 }
 
 int UNeditDatabase::OrientByCoordinates(STNSTRUCT& station, StationWork& work) {
@@ -336,6 +348,7 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
         if (AbortRequested()) return 0;
         UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps),
                        kGeneratingGraphics);
+        ArrangePtNames(target.PtNames.begin(), target.PtNames.end());
         if (!work.HeadPrinted && work.Printing) {
             if (work.HasShots) Report->PrintSSHead();
             work.HeadPrinted = true;
@@ -346,6 +359,7 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
         if (work.Printing) PrintTarget(station, target, e, n, z, false);
         if (IsSelfObservation(station, target)) continue;
         SetCoordOf(target.Name, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
+        Arrange_SS_String(std::wstring(target.SSCode), std::wstring(target.SSName));
     }
     return 1;
 }

@@ -19,11 +19,18 @@
 #include <set>
 #include <string>
 #include <unordered_map>
+#include <unordered_set>
 #include <vector>
 
 #include "codes/ArcStore.h"
+#include "codes/CodeGeometryHost.h"
 #include "codes/LineStore.h"
 #include "codes/PointStore.h"
+#include "codes/StringAssembly.h"
+#include "codes/StringFiling.h"
+#include "codes/UCircleCommandMgr.h"
+#include "codes/UNeditCircle.h"
+#include "codes/USvyCodeCtrl.h"
 #include "platform/geometry/UWCircle.h"
 #include "platform/geometry/UWRect.h"
 #include "platform/text/NameTable.h"
@@ -56,7 +63,7 @@ struct KnownCoord {
 /// lives on from one run and one document to the next, as field software has always kept it.
 extern double CurInstHt;
 
-class UNeditDatabase {
+class UNeditDatabase : private nedit::CodeGeometryHost {
   public:
     /// The engine of a document: its format service, rows (the record list), job and dialog
     /// host, each of which may be null. `chkCode` is the check code, "*CHK" when empty.
@@ -266,12 +273,60 @@ class UNeditDatabase {
     const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList.Items(); }
     const std::vector<UNeditLine>& GetLineList() const { return LineList.Items(); }
     const std::vector<UNeditArc>& GetArcList() const { return ArcList.Items(); }
-    const std::vector<UWCircle>& GetCircleList() const { return CircleList; }
+    const std::vector<UNeditCircle>& GetCircleList() const { return CircleList; }
+
+    // ---- Field codes: strings, shapes, circles (EngineCodes.cpp) -----------------------
+    /// Takes the code grammar from the job's settings (the defaults without a job) and the
+    /// check code from it.
+    int LoadSvyCodeCtrl();
+    const USvyCodeCtrl& GetSvyCodeCtrl() const { return SvyCodeCtrl; }
+    /// Files a reduced point under every group of its code.
+    void Arrange_SS_String(const std::wstring& code, const std::wstring& name);
+    /// Files the points of PT records, by name, under their codes.
+    void Arrange_PT_String(const std::vector<std::wstring>& names) {
+        ArrangePtNames(names.data(), names.data() + names.size());
+    }
+    /// Turns the strings into lines and arcs.
+    void ProcessString();
+    /// Offers a saved point to the circle commands.
+    void ProcessCircle(unsigned index, const std::wstring& code);
+    void ResetCircleData();
+    /// Offsets written in a target's code ("@along,right,up") replace the record's, each only
+    /// when it is not zero. 1, as the code control is always there.
+    int Process_Code_Offsets(SSSTRUCT& target) const;
+    /// Prints the codes that no library defines.
+    void PrintUnDefineCode();
+    const std::vector<CStrNoList>& GetStrings() const { return Strings.Strings(); }
+    const std::map<std::wstring, int>& GetUndefinedCodes() const { return Strings.UndefinedCodes(); }
+    /// Codes the run could not turn into the geometry they ask for, in the order met.
+    const std::vector<std::wstring>& GetCodeNotices() const { return CodeNotices; }
 
     /// The messages of the coordinate dialogs go to this host; null answers by default.
     nedit::DialogHost* GetDialogHost() const { return Host; }
 
   private:
+    // The engine's side of the string filing and assembly (EngineCodes.cpp).
+    int PointIndex(const std::wstring& name) const override;
+    const UNeditPt& PointAt(unsigned index) const override;
+    unsigned SaveDerivedPoint(const std::wstring& name, double x, double y,
+                              const std::wstring& code) override;
+    int SaveStringLine(unsigned from, unsigned to, const std::wstring& code,
+                       const std::wstring& stringName) override;
+    void SaveStringArc(const UNeditPt& first, const UNeditPt& second, const UNeditPt& third,
+                       ArcType type) override;
+    double CodeDistance(double value) const override;
+    bool StopRequested() const override { return AbortRequested(); }
+    void StringProgress(unsigned percent) override;
+    void CodeNotice(const std::wstring& text) override;
+    void ArrangePtNames(const std::wstring* first, const std::wstring* last);
+    /// One message naming every code the run could not turn into its geometry.
+    void ShowCodeNotices(bool printing);
+    /// The feature code and the string name a line or arc of a point's code takes.
+    void CodeOfLinework(const std::wstring& pointCode, std::wstring& code,
+                        std::wstring& stringName) const;
+    /// Layer, colour, line type and thickness of a code, from the job's library.
+    void ApplyCodeLook(const std::wstring& code, UNeditLinework& linework) const;
+
     bool AbortRequested() const;
     void RunStages(nedit::RunStep step);
     void ResetForRerun();
@@ -457,7 +512,15 @@ class UNeditDatabase {
     nedit::PointStore TravPtList;
     nedit::LineStore LineList;
     nedit::ArcStore ArcList;
-    std::vector<UWCircle> CircleList;
+    std::vector<UNeditCircle> CircleList;
+
+    // Field codes.
+    USvyCodeCtrl SvyCodeCtrl;
+    nedit::StringFiling Strings{SvyCodeCtrl, SurveyDoc, *this};
+    nedit::StringAssembly Assembly{SvyCodeCtrl, *this};
+    UCircleCommandMgr CircleMgr;
+    std::unordered_set<int> CirclePoints;
+    std::vector<std::wstring> CodeNotices;
     double XMin = -1e12, YMin = -1e12, XMax = -1e12, YMax = -1e12;
     unsigned LastPercent = 1000;  // none reported yet
     std::wstring LastProgressText;
