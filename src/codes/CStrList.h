@@ -11,7 +11,7 @@ struct CStrList {
     double OffsetAlong = 0.0;  ///< the offsets the code states, unconverted
     double OffsetRight = 0.0;
     double OffsetUp = 0.0;
-    std::wstring Remark;               ///< the group's comment; kept, not read further
+    std::wstring Remark;                ///< the group's comment; kept, not read further
     std::vector<std::wstring> CmdList;  ///< the group's command tokens, empty if none
 };
 

@@ -25,8 +25,8 @@ class CodeGeometryHost {
     virtual int SaveStringLine(unsigned from, unsigned to, const std::wstring& code,
                                const std::wstring& stringName) = 0;
     /// An arc of a string; its code and string come from the second point's code.
-    virtual void SaveStringArc(const UNeditPt& first, const UNeditPt& second,
-                               const UNeditPt& third, ArcType type) = 0;
+    virtual void SaveStringArc(const UNeditPt& first, const UNeditPt& second, const UNeditPt& third,
+                               ArcType type) = 0;
     /// A distance stated in a code, in the file's length unit, converted to the job's.
     virtual double CodeDistance(double value) const = 0;
     /// The user asked the run to stop.

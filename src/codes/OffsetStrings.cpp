@@ -31,8 +31,9 @@ void StringFiling::OffsetStep(const std::wstring& name, const std::wstring& grou
     const CStrNoList& base = StrListHead[string];
     const int point = Host.PointIndex(base.StrList.back().PtName);
     if (point < 0) return;
-    UOffsetStringPtInfo info{base.StrNo, base.Contour, base.Code, group,
-                             Host.PointAt(static_cast<unsigned>(point)), distance};
+    UOffsetStringPtInfo info{
+        base.StrNo, base.Contour, base.Code, group, Host.PointAt(static_cast<unsigned>(point)),
+        distance};
     if (!OffsetPts.empty() && (!EqualsIgnoreCase(OffsetPts.front().StrNo, info.StrNo) ||
                                OffsetPts.front().Code != info.Code)) {
         ProcessOffsetStringPoints();
@@ -58,9 +59,10 @@ void StringFiling::ProcessOffsetStringPoints() {
     if (target == StrListHead.size())
         target = AddString(CStrNoList{{}, first.StrNo, first.Contour, first.Code, first.Group});
     if (base.size() == 1) {
-        Host.CodeNotice(Translate(L"Point {1}: an offset string needs two points; \"{2}\" "
-                                  L"makes no offset point.",
-                                  {first.Pt.GetID(), first.Group}));
+        Host.CodeNotice(
+            Translate(L"Point {1}: an offset string needs two points; \"{2}\" "
+                      L"makes no offset point.",
+                      {first.Pt.GetID(), first.Group}));
         return;
     }
     auto save = [&](const UOffsetStringPtInfo& of, const UWPoint& at) {
@@ -78,7 +80,8 @@ void StringFiling::ProcessOffsetStringPoints() {
         } else {
             UWPolyline meeting;
             const UWLine reversed(offset.GetEnd(), offset.GetStart());
-            const bool meet = previous.IntersectState(reversed, meeting, true, UWLine::kEndless) > 0;
+            const bool meet =
+                previous.IntersectState(reversed, meeting, true, UWLine::kEndless) > 0;
             save(base[k], meet ? meeting.GetAt(0) : previous.GetEnd());
         }
         previous = offset;

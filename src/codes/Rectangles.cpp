@@ -3,7 +3,6 @@
 // points named "RECT-" and the name of the point they stand behind.
 
 #include "codes/StringFiling.h"
-
 #include "platform/geometry/Tolerance.h"
 #include "platform/geometry/UWLine.h"
 #include "platform/messages/Translate.h"
@@ -56,9 +55,10 @@ void StringFiling::RectangleStep(std::size_t string, const std::vector<std::wstr
     const std::size_t needed = kind == USvyCodeCtrl::kTwoPointRect ? 2 : 3;
     const std::wstring& name = list.StrList.back().PtName;
     if (list.StrList.size() < needed) {
-        Host.CodeNotice(Translate(L"Point {1}: the rectangle needs {2} points of its string; "
-                                  L"nothing is made.",
-                                  {name, std::to_wstring(needed)}));
+        Host.CodeNotice(
+            Translate(L"Point {1}: the rectangle needs {2} points of its string; "
+                      L"nothing is made.",
+                      {name, std::to_wstring(needed)}));
         return;
     }
     unsigned index[3] = {0, 0, 0};
@@ -80,9 +80,10 @@ void StringFiling::TwoPointRectangle(CStrNoList& string, unsigned q, unsigned p,
     UWPoint behind_q, behind_p;
     if (!Corners(first, last, width, behind_q, behind_p)) {
         if (!Is_Zero(width)) {
-            Host.CodeNotice(Translate(L"Point {1}: the rectangle's two corners coincide; "
-                                      L"nothing is made.",
-                                      {last.GetID()}));
+            Host.CodeNotice(
+                Translate(L"Point {1}: the rectangle's two corners coincide; "
+                          L"nothing is made.",
+                          {last.GetID()}));
         }
         return;
     }
@@ -101,11 +102,11 @@ void StringFiling::ThreePointRectangle(CStrNoList& string, unsigned r, unsigned 
     const UNeditPt third = Host.PointAt(p);
     const double width = static_cast<const UWPoint&>(third).DistanceTo(UWLine(first, second));
     UWPoint behind_r, behind_q;
-    if (third == first || third == second ||
-        !Corners(first, second, width, behind_r, behind_q)) {
-        Host.CodeNotice(Translate(L"Point {1}: the rectangle's three points fix no rectangle; "
-                                  L"nothing is made.",
-                                  {third.GetID()}));
+    if (third == first || third == second || !Corners(first, second, width, behind_r, behind_q)) {
+        Host.CodeNotice(
+            Translate(L"Point {1}: the rectangle's three points fix no rectangle; "
+                      L"nothing is made.",
+                      {third.GetID()}));
         return;
     }
     if (!(static_cast<const UWPoint&>(third) == behind_q)) {

@@ -77,13 +77,14 @@ void StringAssembly::ProcessString(const std::vector<CStrNoList>& strings,
             }
             if (current == PrevPt) continue;
             if (!ArcOpen && (has & kArcStart) == 0) {
-                const bool circle = circlePoints.count(PrevPt) != 0 &&
-                                    circlePoints.count(current) != 0;
+                const bool circle =
+                    circlePoints.count(PrevPt) != 0 && circlePoints.count(current) != 0;
                 if (!circle) {
                     if ((has & kArcEnd) != 0) {
-                        Host.CodeNotice(Translate(L"Point {1}: an arc end with no arc start; "
-                                                  L"the string runs on straight.",
-                                                  {CurName}));
+                        Host.CodeNotice(
+                            Translate(L"Point {1}: an arc end with no arc start; "
+                                      L"the string runs on straight.",
+                                      {CurName}));
                     }
                     Line(PrevPt, current);
                     if ((has & kClose) != 0) {
@@ -155,9 +156,10 @@ void StringAssembly::Process2PointArc(int next) {
     const UNeditPt first = Host.PointAt(static_cast<unsigned>(start));
     const UNeditPt second = Host.PointAt(static_cast<unsigned>(end));
     if (ArcPts[0] < 0 || next < 0) {
-        Host.CodeNotice(Translate(L"Arc {1}-{2}: no point before or after it to take its "
-                                  L"tangents from; a straight line is drawn.",
-                                  {first.GetID(), second.GetID()}));
+        Host.CodeNotice(
+            Translate(L"Arc {1}-{2}: no point before or after it to take its "
+                      L"tangents from; a straight line is drawn.",
+                      {first.GetID(), second.GetID()}));
         Line(start, end);
         return;
     }
@@ -165,9 +167,10 @@ void StringAssembly::Process2PointArc(int next) {
     const UNeditPt after = Host.PointAt(static_cast<unsigned>(next));
     UWPoint centre;
     if (!Calc_Arc_Center(before, first, second, after, centre)) {
-        Host.CodeNotice(Translate(L"Arc {1}-{2}: its tangents are parallel; neither arc nor "
-                                  L"line is made.",
-                                  {first.GetID(), second.GetID()}));
+        Host.CodeNotice(
+            Translate(L"Arc {1}-{2}: its tangents are parallel; neither arc nor "
+                      L"line is made.",
+                      {first.GetID(), second.GetID()}));
         return;
     }
     const std::wstring name = L"CENTER" + first.GetID() + L"-" + second.GetID();
@@ -181,9 +184,10 @@ void StringAssembly::Process3PointArc() {
     const int on = ArcPts[2];
     const int end = ArcPts.back();
     if (start < 0 || on < 0 || end < 0) {
-        Host.CodeNotice(Translate(L"String {1}: a point of an arc was not reduced; the arc is "
-                                  L"not made.",
-                                  {CurStrName}));
+        Host.CodeNotice(
+            Translate(L"String {1}: a point of an arc was not reduced; the arc is "
+                      L"not made.",
+                      {CurStrName}));
         return;
     }
     Host.SaveStringArc(Host.PointAt(static_cast<unsigned>(start)),

@@ -81,8 +81,8 @@ void StringFiling::InsertStringNoList(const std::wstring& name, const std::wstri
                            &element.OffsetUp, element.Remark, stringName);
     if (CheckCode(feature) < 1 && feature.empty() && Job != nullptr) {
         int answer = 0;
-        feature = Job->GetSurveyCodeEx(USvyCode::kDefaultCode, answer, true, true, false, nullptr)
-                      .Code;
+        feature =
+            Job->GetSurveyCodeEx(USvyCode::kDefaultCode, answer, true, true, false, nullptr).Code;
     }
     if (strNo.empty()) strNo = GetStrNoFromLibrary(feature);
     for (std::size_t i = 1; i < tokens.size(); ++i) {
@@ -91,9 +91,10 @@ void StringFiling::InsertStringNoList(const std::wstring& name, const std::wstri
         element.CmdList.push_back(std::move(token));
     }
     if (strNo.empty() && !element.CmdList.empty() && tokens.front().empty()) {
-        Host.CodeNotice(Translate(L"Point {1}: the commands of \"{2}\" belong to no "
-                                         L"string and make nothing.",
-                                  {name, group}));
+        Host.CodeNotice(
+            Translate(L"Point {1}: the commands of \"{2}\" belong to no "
+                      L"string and make nothing.",
+                      {name, group}));
     }
     const std::vector<std::wstring> commands = element.CmdList;
     const int found = FindString(strNo, feature);
@@ -113,9 +114,10 @@ void StringFiling::InsertStringNoList(const std::wstring& name, const std::wstri
         for (const std::wstring& command : commands) {
             if (Ctrl.IsCmdString(command) == USvyCodeCtrl::kTwoPointRect ||
                 Ctrl.IsCmdString(command) == USvyCodeCtrl::kThreePointRect) {
-                Host.CodeNotice(Translate(L"Point {1}: {2} on the first point of a "
-                                                 L"string makes no rectangle.",
-                                          {name, command}));
+                Host.CodeNotice(
+                    Translate(L"Point {1}: {2} on the first point of a "
+                              L"string makes no rectangle.",
+                              {name, command}));
             }
         }
     }

@@ -6,8 +6,7 @@
 
 namespace {
 
-bool HoldsKeyword(const std::wstring& code, const std::wstring& keyword,
-                  const USvyCodeCtrl& ctrl) {
+bool HoldsKeyword(const std::wstring& code, const std::wstring& keyword, const USvyCodeCtrl& ctrl) {
     std::vector<USvyCodeExt> groups;
     ctrl.ParseString(code, groups);
     return UCircleCommandMgr::FindCode(groups, keyword, ctrl) > 0;
@@ -88,20 +87,19 @@ bool UCircleCommandMgr::Offer(int id, const std::wstring& code, const USvyCodeCt
     if (!RadiusActive && !CircumActive) {
         // Most points open no circle: pass them by without parsing their code.
         const std::wstring upper = nedit::ToUpper(cut);
-        const bool may_open = (!settings.CircleRadiusCmd.empty() &&
-                               upper.find(nedit::ToUpper(settings.CircleRadiusCmd)) !=
-                                   std::wstring::npos) ||
-                              (!settings.CircleCircumCmd.empty() &&
-                               upper.find(nedit::ToUpper(settings.CircleCircumCmd)) !=
-                                   std::wstring::npos);
+        const bool may_open =
+            (!settings.CircleRadiusCmd.empty() &&
+             upper.find(nedit::ToUpper(settings.CircleRadiusCmd)) != std::wstring::npos) ||
+            (!settings.CircleCircumCmd.empty() &&
+             upper.find(nedit::ToUpper(settings.CircleCircumCmd)) != std::wstring::npos);
         if (!may_open) return false;
     }
     std::vector<USvyCodeExt> groups;
     if (ctrl.ParseString(cut, groups) == 0) return false;
-    const bool radius = Joins(groups, RadiusActive, RadiusPoints, settings.CircleRadiusCmd, cut,
-                              ctrl, pointOf);
-    const bool circum = Joins(groups, CircumActive, CircumPoints, settings.CircleCircumCmd, cut,
-                              ctrl, pointOf);
+    const bool radius =
+        Joins(groups, RadiusActive, RadiusPoints, settings.CircleRadiusCmd, cut, ctrl, pointOf);
+    const bool circum =
+        Joins(groups, CircumActive, CircumPoints, settings.CircleCircumCmd, cut, ctrl, pointOf);
     if (!radius && !circum) return false;
     const UNeditPt* here = pointOf(id);
     if (here == nullptr) return false;
@@ -118,9 +116,10 @@ bool UCircleCommandMgr::Offer(int id, const std::wstring& code, const USvyCodeCt
                 made = Made{UNeditCircle(UWCircle(*centre, r), OpeningCode), {id, centre_id}};
                 done = true;
             } else {
-                notice = nedit::Translate(L"Point {1}: the rim point lies on the centre; no circle "
-                                          L"is made.",
-                                          {here->GetID()});
+                notice = nedit::Translate(
+                    L"Point {1}: the rim point lies on the centre; no circle "
+                    L"is made.",
+                    {here->GetID()});
             }
             ResetCR_CmdFlag();
         }
@@ -134,13 +133,14 @@ bool UCircleCommandMgr::Offer(int id, const std::wstring& code, const USvyCodeCt
             const UNeditPt* b = pointOf(CircumPoints[1]);
             const UWCircle circle = a && b ? UWCircle(*here, *a, *b) : UWCircle();
             if (circle.IsValid()) {
-                made = Made{UNeditCircle(circle, OpeningCode),
-                            {id, CircumPoints[0], CircumPoints[1]}};
+                made =
+                    Made{UNeditCircle(circle, OpeningCode), {id, CircumPoints[0], CircumPoints[1]}};
                 done = true;
             } else {
-                notice = nedit::Translate(L"Point {1}: the three points of the circle lie on a "
-                                          L"line or coincide; no circle is made.",
-                                          {here->GetID()});
+                notice = nedit::Translate(
+                    L"Point {1}: the three points of the circle lie on a "
+                    L"line or coincide; no circle is made.",
+                    {here->GetID()});
             }
             ResetCC_CmdFlag();
         }

@@ -12,10 +12,10 @@
 #include <string>
 #include <vector>
 
-#include "codes/USvyCodeCtrl.h"
-#include "codes/USvyCodeExt.h"
 #include "codes/UNeditCircle.h"
 #include "codes/UNeditPt.h"
+#include "codes/USvyCodeCtrl.h"
+#include "codes/USvyCodeExt.h"
 
 class UCircleCommandMgr {
   public:

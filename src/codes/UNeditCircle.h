@@ -9,8 +9,7 @@
 class UNeditCircle : public UWCircle {
   public:
     UNeditCircle() = default;
-    UNeditCircle(const UWCircle& circle, const std::wstring& code)
-        : UWCircle(circle), Code(code) {}
+    UNeditCircle(const UWCircle& circle, const std::wstring& code) : UWCircle(circle), Code(code) {}
     const std::wstring& GetCode() const { return Code; }
 
   private:

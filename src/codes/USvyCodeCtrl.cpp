@@ -8,7 +8,9 @@
 
 namespace {
 
-bool IsDigit(wchar_t c) { return c >= L'0' && c <= L'9'; }
+bool IsDigit(wchar_t c) {
+    return c >= L'0' && c <= L'9';
+}
 
 }  // namespace
 
@@ -114,8 +116,8 @@ std::vector<std::wstring> USvyCodeCtrl::SplitCode(std::wstring_view text, int mo
 std::wstring USvyCodeCtrl::InterpretCommand(std::wstring_view token, std::wstring& value) const {
     value.clear();
     const std::wstring_view trimmed = nedit::TrimView(token);
-    const std::wstring plain[] = {S.ArcStartCmd,  S.ArcEndCmd,       S.CloseCmd,
-                                  S.ChkShotCmd,   S.CircleRadiusCmd, S.CircleCircumCmd,
+    const std::wstring plain[] = {S.ArcStartCmd,     S.ArcEndCmd,       S.CloseCmd,
+                                  S.ChkShotCmd,      S.CircleRadiusCmd, S.CircleCircumCmd,
                                   kThreePointRectCmd};
     for (const std::wstring& word : plain) {
         if (!word.empty() && nedit::EqualsIgnoreCase(trimmed, word)) return nedit::ToUpper(word);
@@ -193,10 +195,10 @@ std::wstring USvyCodeCtrl::InterpretCode(const std::vector<std::wstring>& tokens
         if (!IsOffset(token)) continue;
         std::wstring_view rest = nedit::TrimView(token).substr(1);
         for (double* offset : {along, right, up}) {
-            const std::size_t comma = rest.find(L',');
-            if (offset) *offset = nedit::TextToDouble(rest.substr(0, comma));
-            if (comma == std::wstring_view::npos) break;
-            rest = rest.substr(comma + 1);
+            const std::size_t part = rest.find(kOffsetPart);
+            if (offset) *offset = nedit::TextToDouble(rest.substr(0, part));
+            if (part == std::wstring_view::npos) break;
+            rest = rest.substr(part + 1);
         }
         break;
     }
@@ -233,8 +235,8 @@ int USvyCodeCtrl::ParseString(std::wstring_view code, std::vector<USvyCodeExt>& 
         USvyCodeExt ext;
         std::wstring remark, name;
         int contour = -1;
-        ext.Code = InterpretCode(tokens, ext.StrNo, &contour, nullptr, nullptr, nullptr, remark,
-                                 name);
+        ext.Code =
+            InterpretCode(tokens, ext.StrNo, &contour, nullptr, nullptr, nullptr, remark, name);
         ext.ContourGiven = contour >= 0;
         ext.ContourValue = contour < 0 ? 0 : contour;
         for (std::size_t i = 1; i < tokens.size(); ++i) {
@@ -263,4 +265,6 @@ std::wstring USvyCodeCtrl::JoinedName(const std::wstring& code, const std::wstri
     return S.StrNoFirst ? strNo + code : code + strNo;
 }
 
-std::wstring USvyCodeCtrl::ChkCode() const { return std::wstring(1, Separator()) + S.ChkShotCmd; }
+std::wstring USvyCodeCtrl::ChkCode() const {
+    return std::wstring(1, Separator()) + S.ChkShotCmd;
+}

@@ -17,8 +17,9 @@
 //    is a feature code, not AS and PH. A word that takes a number followed by a digit, a sign,
 //    a point or a comma is that command: "RECT2,5" is a RECT whose width is no number (the
 //    run says so and makes no rectangle).
-//  * An offset token begins with "@" and gives along, right and up, parted by commas:
-//    "@0,1.5" or "@,,-0.2"; a missing part is 0. Offsets are in the file's length unit.
+//  * An offset token begins with "@" and gives along, right and up, parted by colons (a comma
+//    would end the record's field): "@0:1.5" or "@::-0.2"; a missing part is 0. Offsets are
+//    in the file's length unit.
 //  * Every other token is a feature token and begins a group: the feature code with its
 //    string number. The number is the run of digits at the end of the token (at its start
 //    when StrNoFirst is set): "KB01" is feature KB, number 01. The number is kept as written,
@@ -45,8 +46,9 @@ class USvyCodeCtrl {
     static constexpr int kOffsetString = 7;
     /// The word of the three-point rectangle, which the job's settings do not hold.
     static constexpr const wchar_t* kThreePointRectCmd = L"R3P";
-    /// The prefix of an offset token.
+    /// The prefix of an offset token, and the mark between its values.
     static constexpr wchar_t kOffsetMark = L'@';
+    static constexpr wchar_t kOffsetPart = L':';
 
     explicit USvyCodeCtrl(nedit::CodeSettings settings = {});
     const nedit::CodeSettings& Settings() const { return S; }

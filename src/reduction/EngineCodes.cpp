@@ -27,9 +27,10 @@ void UNeditDatabase::Arrange_SS_String(const std::wstring& code, const std::wstr
         // What stands behind the comment mark is not read, commands included: say so.
         for (const std::wstring& token : SvyCodeCtrl.SplitCode(code.substr(comment + 1), 1)) {
             if (SvyCodeCtrl.IsCommand(token)) {
-                CodeNotice(nedit::Translate(L"Point {1}: {2} stands behind the comment mark of "
-                                            L"\"{3}\" and is not read.",
-                                            {name, token, code}));
+                CodeNotice(
+                    nedit::Translate(L"Point {1}: {2} stands behind the comment mark of "
+                                     L"\"{3}\" and is not read.",
+                                     {name, token, code}));
             }
         }
     }
@@ -47,7 +48,9 @@ void UNeditDatabase::ArrangePtNames(const std::wstring* first, const std::wstrin
     }
 }
 
-void UNeditDatabase::ProcessString() { Assembly.ProcessString(Strings.Strings(), CirclePoints); }
+void UNeditDatabase::ProcessString() {
+    Assembly.ProcessString(Strings.Strings(), CirclePoints);
+}
 
 void UNeditDatabase::ResetCircleData() {
     CircleMgr.Reset();
@@ -98,9 +101,13 @@ void UNeditDatabase::PrintUnDefineCode() {
     }
 }
 
-int UNeditDatabase::PointIndex(const std::wstring& name) const { return GetPointIdx(name); }
+int UNeditDatabase::PointIndex(const std::wstring& name) const {
+    return GetPointIdx(name);
+}
 
-const UNeditPt& UNeditDatabase::PointAt(unsigned index) const { return PointList[index]; }
+const UNeditPt& UNeditDatabase::PointAt(unsigned index) const {
+    return PointList[index];
+}
 
 unsigned UNeditDatabase::SaveDerivedPoint(const std::wstring& name, double x, double y,
                                           const std::wstring& code) {
@@ -144,7 +151,13 @@ int UNeditDatabase::SaveStringLine(unsigned from, unsigned to, const std::wstrin
 
 void UNeditDatabase::SaveStringArc(const UNeditPt& first, const UNeditPt& second,
                                    const UNeditPt& third, ArcType type) {
-    SaveArc(first, second, third, type);
+    // An arc takes its code and string from its second point, not from the string in hand.
+    UNeditArc& arc = ArcList.At(static_cast<std::size_t>(SaveArc(first, second, third, type)));
+    std::wstring code, string_name;
+    CodeOfLinework(second.GetCode(), code, string_name);
+    arc.SetCode(code);
+    arc.SetStringNo(string_name);
+    ApplyCodeLook(code, arc);
 }
 
 double UNeditDatabase::CodeDistance(double value) const {
@@ -155,7 +168,9 @@ void UNeditDatabase::StringProgress(unsigned percent) {
     UpdateProgress(percent, percent == 0 ? L"" : L"Generating Graphics");
 }
 
-void UNeditDatabase::CodeNotice(const std::wstring& text) { CodeNotices.push_back(text); }
+void UNeditDatabase::CodeNotice(const std::wstring& text) {
+    CodeNotices.push_back(text);
+}
 
 void UNeditDatabase::ShowCodeNotices(bool printing) {
     if (CodeNotices.empty()) return;

@@ -297,7 +297,9 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     /// Prints the codes that no library defines.
     void PrintUnDefineCode();
     const std::vector<CStrNoList>& GetStrings() const { return Strings.Strings(); }
-    const std::map<std::wstring, int>& GetUndefinedCodes() const { return Strings.UndefinedCodes(); }
+    const std::map<std::wstring, int>& GetUndefinedCodes() const {
+        return Strings.UndefinedCodes();
+    }
     /// Codes the run could not turn into the geometry they ask for, in the order met.
     const std::vector<std::wstring>& GetCodeNotices() const { return CodeNotices; }
 

@@ -91,8 +91,8 @@ TEST_F(StringWork, ThreePointArcAndAClosedBuilding) {
     EXPECT_TRUE(host.HasLine(L"D", L"E"));
     EXPECT_FALSE(host.HasLine(L"B", L"C"));
     EXPECT_FALSE(host.HasLine(L"C", L"D"));
-    for (const auto& [a, b] : {std::pair{L"H1", L"H2"}, {L"H2", L"H3"}, {L"H3", L"H4"},
-                               {L"H4", L"H1"}}) {
+    for (const auto& [a, b] :
+         {std::pair{L"H1", L"H2"}, {L"H2", L"H3"}, {L"H3", L"H4"}, {L"H4", L"H1"}}) {
         EXPECT_TRUE(host.HasLine(a, b));
     }
     EXPECT_EQ(host.Lines.size(), 6u);
@@ -159,8 +159,8 @@ TEST_F(StringWork, TwoPointRectangleOnEitherSide) {
 }
 
 TEST_F(StringWork, RectangleCommandsThatMakeNothingSaySo) {
-    Shot(L"A", 0, 0, L"SH03*RECT3");  // first point of its string
-    Shot(L"B", 4, 0, L"SH03*RECT");   // no width
+    Shot(L"A", 0, 0, L"SH03*RECT3");    // first point of its string
+    Shot(L"B", 4, 0, L"SH03*RECT");     // no width
     Shot(L"C", 8, 0, L"SH03*RECT2,5");  // a width that is no number
     Assemble();
     EXPECT_EQ(StringOf(L"03", L"SH"), (std::vector<std::wstring>{L"A", L"B", L"C"}));
@@ -224,14 +224,12 @@ TEST_F(StringWork, OffsetNamesAreMadeUniqueAndOnePointMakesNone) {
 TEST(ArcCentre, TangentsThatCannotBothHoldAreProjectedOntoTheBisector) {
     UWPoint centre;
     // Legs in line with the chord: the normals are parallel.
-    EXPECT_FALSE(nedit::StringAssembly::Calc_Arc_Center({0, 0}, {10, 0}, {20, 0}, {30, 0},
-                                                        centre));
+    EXPECT_FALSE(nedit::StringAssembly::Calc_Arc_Center({0, 0}, {10, 0}, {20, 0}, {30, 0}, centre));
     // Incoming East at B(10, 0), outgoing North at C(20, 5): the normals x = 10 and y = 5
     // meet at (10, 5), 10 from B but 10 from C too only on the bisector of the chord B-C.
     // The bisector runs through (15, 2.5) along (-5, 10)/|..|; (10, 5) lies at distance
     // ((10-15)(-5) + (5-2.5)(10)) / sqrt(125) = 50 / sqrt(125) along it, at (13, 6.5).
-    ASSERT_TRUE(nedit::StringAssembly::Calc_Arc_Center({0, 0}, {10, 0}, {20, 5}, {20, 20},
-                                                       centre));
+    ASSERT_TRUE(nedit::StringAssembly::Calc_Arc_Center({0, 0}, {10, 0}, {20, 5}, {20, 20}, centre));
     EXPECT_NEAR(centre.x, 13.0, 1e-9);
     EXPECT_NEAR(centre.y, 6.5, 1e-9);
 }

@@ -50,8 +50,8 @@ TEST(CodeGrammar, FeatureNumberContourAndOffsets) {
     std::wstring strNo, remark, name;
     int contour = 0;
     double along = 9, right = 9, up = 9;
-    EXPECT_EQ(ctrl.InterpretCode({L"kb01", L"AS", L"@0.5,-1.25"}, strNo, &contour, &along,
-                                 &right, &up, remark, name),
+    EXPECT_EQ(ctrl.InterpretCode({L"kb01", L"AS", L"@0.5:-1.25"}, strNo, &contour, &along, &right,
+                                 &up, remark, name),
               L"KB");
     EXPECT_EQ(strNo, L"01");
     EXPECT_EQ(name, L"KB01");
@@ -59,18 +59,18 @@ TEST(CodeGrammar, FeatureNumberContourAndOffsets) {
     EXPECT_DOUBLE_EQ(along, 0.5);
     EXPECT_DOUBLE_EQ(right, -1.25);
     EXPECT_DOUBLE_EQ(up, 0.0);
-    EXPECT_EQ(ctrl.InterpretCode({L"TREE"}, strNo, &contour, nullptr, nullptr, nullptr, remark,
-                                 name),
-              L"TREE");
+    EXPECT_EQ(
+        ctrl.InterpretCode({L"TREE"}, strNo, &contour, nullptr, nullptr, nullptr, remark, name),
+        L"TREE");
     EXPECT_EQ(strNo, L"");
 
     nedit::CodeSettings first;
     first.StrNoFirst = 1;
     first.ContourDigit = 1;
     const USvyCodeCtrl leading(first);
-    EXPECT_EQ(leading.InterpretCode({L"011KB"}, strNo, &contour, nullptr, nullptr, nullptr,
-                                    remark, name),
-              L"KB");
+    EXPECT_EQ(
+        leading.InterpretCode({L"011KB"}, strNo, &contour, nullptr, nullptr, nullptr, remark, name),
+        L"KB");
     EXPECT_EQ(strNo, L"01");
     EXPECT_EQ(contour, 1);
     EXPECT_EQ(name, L"01KB");
