@@ -13,6 +13,7 @@
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
 #include "records/RowSource.h"
+#include "reduction/StationWork.h"
 #include "reduction/UBKBCoordDlg.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "reduction/UNeditDatabase.h"
@@ -23,23 +24,6 @@ namespace {
 constexpr const wchar_t* kGeneratingGraphics = L"Generating Graphics";
 
 }  // namespace
-
-/// What lives while one station is worked.
-struct UNeditDatabase::StationWork {
-    double StnE = 0.0;
-    double StnN = 0.0;
-    double StnZ = kNoHeight;
-    std::wstring StnCodeOut;
-    double BackBearing = 0.0;
-    double BsReading = 0.0;
-    std::size_t StepsDone = 0;
-    std::size_t Steps = 1;
-    bool HasShots = false;
-    bool HeadPrinted = false;
-    /// The blocks of stations and targets are written: there is a report, reporting is on,
-    /// and the report keeps its text (one that keeps none would only throw them away).
-    bool Printing = false;
-};
 
 void UNeditDatabase::geo_coord(double e, double n, double bearing, double dist, double* eOut,
                                double* nOut) {
@@ -92,6 +76,9 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
 
     Strings.DeleteStrNoList();
     CodeNotices.clear();
+    if (report == 1) CheckResults.clear();
+    const STNSTRUCT* last_station = nullptr;
+    StationWork last_work;
     ResetCircleData();
 
     const bool printing = Report != nullptr && report == 1;
@@ -161,8 +148,14 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
             !SideShotPass(station, work, report)) {
             aborted = true;
         }
+        if (report == 1) ProcessChkShot(station.ChkShots, station, work);
+        last_station = &station;
+        last_work = work;
     }
     Strings.ProcessOffsetStringPoints();
+    if (report == 1 && last_station != nullptr && CurChkList) {
+        for (const SSCheck& check : *CurChkList) PrintChkShot(*last_station, last_work, check);
+    }
     if (CurPtNames) ArrangePtNames(CurPtNames->data(), CurPtNames->data() + CurPtNames->size());
     UpdateProgress(100, L"");
     if (printing) PrintUnDefineCode();
@@ -353,6 +346,7 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
             if (work.HasShots) Report->PrintSSHead();
             work.HeadPrinted = true;
         }
+        if (report == 1) ProcessChkShot(target.ChkShots, station, work);
         if (!target.AngleValid || target.ForwardFlag) continue;
         double e = 0.0, n = 0.0, z = kNoHeight;
         ReduceTarget(station, target, work, e, n, z);

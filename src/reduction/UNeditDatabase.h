@@ -38,6 +38,7 @@
 #include "records/RecordFields.h"
 #include "records/UNeutralFileFormat.h"
 #include "reduction/CError.h"
+#include "reduction/CheckResult.h"
 #include "reduction/ObservationModel.h"
 #include "reduction/RowIndex.h"
 #include "reduction/RunStage.h"
@@ -296,6 +297,11 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     int Process_Code_Offsets(SSSTRUCT& target) const;
     /// Prints the codes that no library defines.
     void PrintUnDefineCode();
+    /// The name of the known point written behind the check code ("*CHK P12" gives P12);
+    /// false, leaving `name` alone, when there is none.
+    bool GetChkPtName(const std::wstring& code, std::wstring& name) const;
+    /// The check shots of the last run with a report, in the order they were printed.
+    const std::vector<CheckResult>& GetChecks() const { return CheckResults; }
     const std::vector<CStrNoList>& GetStrings() const { return Strings.Strings(); }
     const std::map<std::wstring, int>& GetUndefinedCodes() const {
         return Strings.UndefinedCodes();
@@ -328,6 +334,10 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
                         std::wstring& stringName) const;
     /// Layer, colour, line type and thickness of a code, from the job's library.
     void ApplyCodeLook(const std::wstring& code, UNeditLinework& linework) const;
+
+    // Check shots (CheckShots.cpp).
+    bool IsCheckShot(int type, std::wstring_view code) const;
+    void TakeCheckShot(const SSSTRUCT& target, const MEASSTRUCT& measurement);
 
     bool AbortRequested() const;
     void RunStages(nedit::RunStep step);
@@ -423,6 +433,9 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     int SideShotPass(STNSTRUCT& station, StationWork& work, int report);
     bool IsSelfObservation(const STNSTRUCT& station, const SSSTRUCT& target) const;
     // The report's part of the walk; called only with a report and reporting on.
+    void ProcessChkShot(const SparseList<SSCheck>& checks, const STNSTRUCT& station,
+                        const StationWork& work);
+    void PrintChkShot(const STNSTRUCT& station, const StationWork& work, const SSCheck& check);
     void PrintRunHead();
     void PrintStationBlock(const STNSTRUCT& station, const StationWork& work);
     void PrintTarget(const STNSTRUCT& station, const SSSTRUCT& target, double e, double n, double z,
@@ -523,6 +536,7 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     UCircleCommandMgr CircleMgr;
     std::unordered_set<int> CirclePoints;
     std::vector<std::wstring> CodeNotices;
+    std::vector<CheckResult> CheckResults;
     double XMin = -1e12, YMin = -1e12, XMax = -1e12, YMax = -1e12;
     unsigned LastPercent = 1000;  // none reported yet
     std::wstring LastProgressText;

@@ -68,6 +68,11 @@ void EachReducedPoint(const UNeditDatabase& engine,
     }
 }
 
+// A position as {"e", "n", "h"}, the height null when there is none.
+json::Value Position(double e, double n, double h) {
+    return {{"e", e}, {"n", n}, {"h", h > kNoHeight ? json::Value(h) : json::Value(nullptr)}};
+}
+
 // A reduced point as the JSON of a run gives it: the members of a point, whether it was
 // derived by computation, and what is attached to it, on the points that have it.
 std::string ReducedPointJson(const UNeditPt& point) {
@@ -189,6 +194,31 @@ bool WriteReductionJson(const UNeditDatabase& engine, const std::vector<std::wst
                              {"radius", circle.GetRadius()},
                              {"centre", {{"e", circle.GetCentre().x}, {"n", circle.GetCentre().y}}},
                              {"code", json::Text(circle.GetCode())}});
+    });
+    member("checks", engine.GetChecks(), [](const CheckResult& check) {
+        const bool finite = std::isfinite(check.E) && std::isfinite(check.N) &&
+                            std::isfinite(check.KnownE) && std::isfinite(check.KnownN);
+        if (!finite) return std::string();
+        json::Value row = {{"id", json::Text(check.Id)},
+                           {"station", json::Text(check.Station)},
+                           {"point", json::Text(check.KnownName)},
+                           {"observed", Position(check.E, check.N, check.H)}};
+        // A known point that could not be had has no known position and no differences.
+        if (check.Known) {
+            const bool heights = check.H > kNoHeight && check.KnownH > kNoHeight;
+            row["known"] = Position(check.KnownE, check.KnownN, check.KnownH);
+            row["differences"] = {
+                {"e", check.E - check.KnownE},
+                {"n", check.N - check.KnownN},
+                {"h", heights ? json::Value(check.H - check.KnownH) : json::Value(nullptr)},
+                {"bearing", check.BearingDiff},
+                {"distance", check.DistanceDiff}};
+            row["bearing"] = check.Bearing;
+            row["known_bearing"] = check.KnownBearing;
+            row["distance"] = check.Distance;
+            row["known_distance"] = check.KnownDistance;
+        }
+        return json::Inline(row);
     });
     json::Value said = json::Value::array();
     for (const std::wstring& message : messages) said.push_back(json::Text(message));
