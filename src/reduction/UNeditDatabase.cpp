@@ -118,6 +118,7 @@ int UNeditDatabase::Process() {
     SetMinMaxCoord();
     if (result == 0) return 0;
     RunStages(nedit::RunStep::Routes);
+    ProcessAttachments();
     RunStages(nedit::RunStep::Attachments);
     return 1;
 }

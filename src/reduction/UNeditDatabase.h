@@ -259,6 +259,13 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     int SearchArc(const std::wstring& a, const std::wstring& b, const std::wstring& third,
                   ArcType type) const;
 
+    // ---- Images, attributes and notes (Attachments.cpp) ---------------------------------
+    /// The walks below that the rows have records for; Process calls it last.
+    void ProcessAttachments();
+    int ProcessImages();
+    int ProcessPointAttributes();
+    int ProcessPointNotes();
+
     // ---- Derived points back into the rows --------------------------------------------
     /// Writes the adjusted points as XYZ rows behind the marker row, making the marker when
     /// there is none. 1 when rows were written.
@@ -335,6 +342,10 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     /// Layer, colour, line type and thickness of a code, from the job's library.
     void ApplyCodeLook(const std::wstring& code, UNeditLinework& linework) const;
 
+    /// Calls take(type, false) for each row with a record type: true asks for the record to
+    /// be parsed, and take(type, true) follows with its fields in hand.
+    template <typename Take>
+    void EachRecord(Take take);
     // Check shots (CheckShots.cpp).
     bool IsCheckShot(int type, std::wstring_view code) const;
     void TakeCheckShot(const SSSTRUCT& target, const MEASSTRUCT& measurement);
