@@ -163,10 +163,9 @@ void StringAssembly::Process2PointArc(int next) {
         Line(start, end);
         return;
     }
-    const UNeditPt before = Host.PointAt(static_cast<unsigned>(ArcPts[0]));
-    const UNeditPt after = Host.PointAt(static_cast<unsigned>(next));
     UWPoint centre;
-    if (!Calc_Arc_Center(before, first, second, after, centre)) {
+    if (!Calc_Arc_Center(Host.PointAt(static_cast<unsigned>(ArcPts[0])), first, second,
+                         Host.PointAt(static_cast<unsigned>(next)), centre)) {
         Host.CodeNotice(
             Translate(L"Arc {1}-{2}: its tangents are parallel; neither arc nor "
                       L"line is made.",
