@@ -11,6 +11,7 @@
 #include <string>
 #include <vector>
 
+#include "BenchJob.h"
 #include "platform/job/UDBLine.h"
 #include "platform/job/UDBPoint.h"
 #include "platform/job/UDBPolyLine.h"
@@ -19,21 +20,13 @@
 
 namespace {
 
+using nedit::bench::RemoveJob;
+using nedit::bench::TempJobPath;
+
 constexpr int kPoints = 100000;
 constexpr int kLines = 100000;
 constexpr int kPolylines = 10000;
 constexpr int kVerticesPerPolyline = 10;
-
-std::string TempJobPath() {
-    char folder[] = "/tmp/sxnedit-bench-XXXXXX";
-    const char* made = mkdtemp(folder);
-    return std::string(made != nullptr ? made : "/tmp") + "/bench.job";
-}
-
-void RemoveJob(const std::string& path) {
-    std::remove(path.c_str());
-    rmdir(path.substr(0, path.rfind('/')).c_str());
-}
 
 std::wstring PointName(int i) {
     return L"P" + std::to_wstring(i);

@@ -1,5 +1,6 @@
-// Importing generated Leica GSI-16 files of growing size: through the driver alone, and
-// through the document into its record list as the import command does.
+// Importing generated raw files of growing size: Leica GSI-16 through the driver alone and
+// through the document into its record list as the import command does, and Carlson RW5
+// (a line-based driver) through the driver alone.
 
 #include <benchmark/benchmark.h>
 #include <stdlib.h>
@@ -33,21 +34,40 @@ std::string MakeGsi(long blocks) {
     return path;
 }
 
+// A set-up and `shots` side shots on both faces as an RW5 file writes them (about 60 bytes
+// a line).
+std::string MakeRw5(long shots) {
+    const std::string path = "/tmp/sxnedit-bench-" + std::to_string(shots) + ".rw5";
+    if (std::ifstream(path)) return path;
+    std::ofstream out(path, std::ios::binary);
+    out << "MO,AD0,UN1,SF1.00000000,EC0,EO0.0,AU0\r\nOC,OP1,N 1000.000,E 2000.000,EL50.000\r\n"
+           "LS,HI1.500,HR1.800\r\nBK,OP1,BP2,BS,BC0.0000\r\n";
+    char line[128];
+    for (long i = 0; i < shots; ++i) {
+        std::snprintf(line, sizeof line,
+                      "%s,OP1,FP%ld,AR%ld.%02ld%02ld,ZE%ld.%02ld%02ld,SD%ld.%03ld,--TREE\r\n",
+                      i % 2 == 0 ? "FD" : "FR", i / 2 + 3, i % 360, i % 60, i * 7 % 60,
+                      i % 2 == 0 ? 89L : 270L, i % 60, i * 3 % 60, 10 + i % 500, i % 1000);
+        out << line;
+    }
+    return path;
+}
+
 // A document with the build's drivers, its record definition and settings in /tmp.
 struct Session {
-    Session() {
+    explicit Session(const wchar_t* driver = L"Leica GSI") {
         setenv("SXNEDIT_CONFIG", "/tmp/sxnedit-bench-config", 1);
         doc.SetDeviceManager(
             std::make_unique<UDeviceManager>(L"", 0, false, SXNEDIT_BENCH_DRIVER_DIR));
-        doc.GetDeviceManager()->LoadDLL(L"Leica GSI");
+        doc.GetDeviceManager()->LoadDLL(driver);
     }
     UNeditDoc doc{nullptr};
     UListCtrl list{&doc};
 };
 
-void DriverOnly(benchmark::State& state) {
-    const std::string path = MakeGsi(state.range(0));
-    Session session;
+// The records of the raw file `path` through the driver `driver` alone.
+void ThroughTheDriver(benchmark::State& state, const std::string& path, const wchar_t* driver) {
+    Session session(driver);
     UDeviceManager& manager = *session.doc.GetDeviceManager();
     long records = 0;
     for (auto _ : state) {
@@ -60,6 +80,14 @@ void DriverOnly(benchmark::State& state) {
     }
     state.SetItemsProcessed(state.iterations() * state.range(0));
     state.counters["records"] = static_cast<double>(records);
+}
+
+void DriverOnly(benchmark::State& state) {
+    ThroughTheDriver(state, MakeGsi(state.range(0)), L"Leica GSI");
+}
+
+void Rw5DriverOnly(benchmark::State& state) {
+    ThroughTheDriver(state, MakeRw5(state.range(0)), L"Carlson RW5");
 }
 
 void IntoTheList(benchmark::State& state) {
@@ -77,5 +105,6 @@ void IntoTheList(benchmark::State& state) {
 }  // namespace
 
 BENCHMARK(DriverOnly)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond);
+BENCHMARK(Rw5DriverOnly)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond);
 BENCHMARK(IntoTheList)->Arg(10'000)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond);
 BENCHMARK_MAIN();

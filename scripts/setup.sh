@@ -7,7 +7,7 @@ BUILD_DIR="${SXNEDIT_BUILD_DIR:-$ROOT/build}"
 
 # Debian packages the build and the tests need.
 PACKAGES=(g++ cmake ninja-build pkg-config libgtest-dev libgmock-dev libbenchmark-dev
-          libsqlite3-dev libcli11-dev nlohmann-json3-dev python3)
+          libsqlite3-dev libcli11-dev nlohmann-json3-dev python3 qt6-base-dev xvfb xauth)
 # And the build under the sanitizers, with the fuzz targets (scripts/test-sanitizers).
 SANITIZER_PACKAGES=(clang libclang-rt-dev)
 

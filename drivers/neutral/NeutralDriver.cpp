@@ -6,7 +6,8 @@
 //   must; anything else is refused with the reader's message, so a file of another format
 //   is not read as comments. An instrument on a link may leave the header out: the driver
 //   then writes it itself.
-// - Lines end at CR LF, LF or a lone CR. Blank lines give no record. A line that is not
+// - Lines end at CR LF, LF or a lone CR (LineSplitter.h). Blank lines give no record. A line that
+// is not
 //   UTF-8 is read as Latin-1, and control characters in it become blanks.
 // - A line longer than a record may be is not cut into a record with half its fields: it
 //   becomes a comment that names its line, and the user is told how many there were.
@@ -16,6 +17,7 @@
 #include <string>
 
 #include "DriverSession.h"
+#include "LineSplitter.h"
 
 namespace {
 
@@ -37,30 +39,16 @@ bool IsHeader(const std::string& line) {
 class NeutralSession : public sxn_session {
   public:
     NeutralSession(const sxn_host& host, unsigned mode, unsigned flags, bool link)
-        : sxn_session(host, mode, flags), link_(link) {}
+        : sxn_session(host, mode, flags),
+          link_(link),
+          lines_([this](const sxn::RawLine& line) { EndLine(line); }) {}
 
     int Translate(const unsigned char* bytes, std::size_t size) override {
-        for (std::size_t i = 0; i < size && !ended_; ++i) {
-            const unsigned char byte = bytes[i];
-            if (sxn::IsEndOfTransmission(byte) && length_ == 0) {
-                EndLine();
-                ended_ = true;
-            } else if (byte == '\n' && last_cr_) {
-                last_cr_ = false;
-            } else if (byte == '\n' || byte == '\r') {
-                EndLine();
-                last_cr_ = byte == '\r';
-            } else if (!sxn::IsFlowControl(byte)) {
-                last_cr_ = false;
-                if (line_.size() < kKeep) line_ += static_cast<char>(byte);
-                ++length_;
-            }
-        }
-        return ended_ ? SXN_END : SXN_MORE;
+        return lines_.Feed(bytes, size) && !ended_ ? SXN_MORE : SXN_END;
     }
 
     void Finish() override {
-        if (!ended_) EndLine();
+        if (!ended_) lines_.Finish();
         if (too_long_ > 0) {
             Message(std::to_string(too_long_) + (too_long_ == 1 ? " line was" : " lines were") +
                     " longer than " + std::to_string(SXN_RECORD_MAX) +
@@ -69,13 +57,10 @@ class NeutralSession : public sxn_session {
     }
 
   private:
-    void EndLine() {
-        ++line_number_;
-        std::string line = sxn::LineToUtf8(line_);
-        const std::size_t length = length_;
-        line_.clear();
-        length_ = 0;
-        if (line_number_ == 1 && line.rfind("\xEF\xBB\xBF", 0) == 0) line.erase(0, 3);
+    void EndLine(const sxn::RawLine& raw) {
+        if (ended_) return;
+        std::string line = sxn::LineToUtf8(raw.bytes.substr(0, kKeep));
+        if (raw.number == 1 && line.rfind("\xEF\xBB\xBF", 0) == 0) line.erase(0, 3);
         for (char& c : line) {
             if (static_cast<unsigned char>(c) < 0x20) c = ' ';
         }
@@ -83,10 +68,10 @@ class NeutralSession : public sxn_session {
         if (last == std::string::npos) return;
         line.erase(last + 1);
         if (!header_seen_ && !TakeHeader(line)) return;
-        if (length > SXN_RECORD_MAX) {
+        if (raw.length > SXN_RECORD_MAX) {
             ++too_long_;
-            Record("# LINE " + std::to_string(line_number_) + " TOO LONG (" +
-                   std::to_string(length) +
+            Record("# LINE " + std::to_string(raw.number) + " TOO LONG (" +
+                   std::to_string(raw.length) +
                    " CHARACTERS): " + sxn::Printable(line, kShownOfLongLine));
             Acknowledge(false);
             return;
@@ -112,13 +97,10 @@ class NeutralSession : public sxn_session {
     }
 
     const bool link_;
-    std::string line_;
-    std::size_t length_ = 0;  // of the line as it came, also what was not kept
-    long line_number_ = 0;
+    sxn::LineSplitter lines_;
     long too_long_ = 0;
-    bool last_cr_ = false;
     bool header_seen_ = false;
-    bool ended_ = false;
+    bool ended_ = false;  // the data were refused
 };
 
 }  // namespace

@@ -39,10 +39,15 @@ class UClipboard {
 namespace nedit {
 
 /// What the widget of the list hears from the logic. Every call comes after the change
-/// it reports; the defaults ignore it, so a face overrides only what it shows.
+/// it reports, except the "about to" calls, which come before it while the rows are still
+/// as they were; the defaults ignore them all, so a face overrides only what it shows.
 class ListEvents {
   public:
     virtual ~ListEvents() = default;
+    virtual void RowsAboutToBeInserted(int /*first*/, int /*count*/) {}
+    virtual void RowsAboutToBeRemoved(int /*first*/, int /*count*/) {}
+    virtual void RowAboutToChange(int /*row*/) {}
+    virtual void RowsAboutToBeCleared() {}
     virtual void RowsInserted(int /*first*/, int /*count*/) {}
     virtual void RowsRemoved(int /*first*/, int /*count*/) {}
     virtual void RowChanged(int /*row*/) {}

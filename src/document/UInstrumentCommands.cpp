@@ -52,7 +52,8 @@ bool UInstrumentCommands::MayOverwrite() {
 
 void UInstrumentCommands::Reduce() {
     Doc.SetModified(1);
-    if (Doc.SetupDataBase(&List) && !Doc.GetAbortProcess()) View.ShowNewData();
+    if (View.Reduction([this] { return Doc.SetupDataBase(&List); }) && !Doc.GetAbortProcess())
+        View.ShowNewData();
 }
 
 int UInstrumentCommands::GetDeviceDriverFileExt(const std::wstring& device, bool,
@@ -100,7 +101,8 @@ int UInstrumentCommands::OnImportRawfile() {
                                          : std::string();
             if (!path.empty()) {
                 List.DeleteAllItems();
-                imported = Doc.Import(nedit::FromUtf8(path), &List);
+                imported =
+                    View.Transfer(false, [&] { return Doc.Import(nedit::FromUtf8(path), &List); });
                 if (imported == 0) Tell(manager->GetLastError());
                 Reduce();
             }
@@ -197,7 +199,8 @@ int UInstrumentCommands::OnNeditDownload() {
     DownloadActive = true;
     List.DeleteAllItems();
     manager->SetAckNak(AckNak);
-    if (!Doc.Download(nedit::FromUtf8(RawFilePath), &List)) {
+    if (!View.Transfer(true,
+                       [this] { return Doc.Download(nedit::FromUtf8(RawFilePath), &List); })) {
         Tell(manager->GetLastError());
         manager->DeleteDLL();
         return 0;

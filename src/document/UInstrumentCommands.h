@@ -13,6 +13,7 @@
 //   temporary file holds everything that arrived either way.
 // - "Import from Device..." only loads and unloads the driver, as its dialog keeps it hidden.
 
+#include <functional>
 #include <string>
 
 #include "platform/messages/DialogHost.h"
@@ -30,6 +31,14 @@ class UTransferView {
     virtual void ClearForm() {}
     /// Clears the graphic view's selected line, resets its extents and redraws it.
     virtual void ShowNewData() {}
+    /// Runs `transfer`, the records of a raw file or (with `download`) of an instrument
+    /// coming into the list, as the window shows such work; gives what it gives.
+    virtual int Transfer(bool /*download*/, const std::function<int()>& transfer) {
+        return transfer();
+    }
+    /// Runs `reduce`, which replaces the document's engine, as the window shows a reduction;
+    /// gives what it gives.
+    virtual int Reduction(const std::function<int()>& reduce) { return reduce(); }
 };
 
 class UInstrumentCommands {

@@ -63,6 +63,7 @@ const std::vector<std::wstring>& UListCtrl::GetRows() const {
 
 void UListCtrl::DeleteAllItems() {
     const bool had_selection = GetFirstSelected() >= 0 || focus_ >= 0;
+    if (events_ != nullptr) events_->RowsAboutToBeCleared();
     rows_.clear();
     RowsChanged();
     selected_.clear();
@@ -80,16 +81,30 @@ void UListCtrl::Reserve(std::size_t rows) {
     selected_.reserve(rows);
 }
 
+bool UListCtrl::RestoreRows(int row, std::vector<std::wstring> texts) {
+    if (row < 0 || row > GetItemCount()) return false;
+    InsertRows(row, std::move(texts));
+    return true;
+}
+
+bool UListCtrl::RestoreRowText(int row, std::wstring text) {
+    if (!InRange(row)) return false;
+    ReplaceRow(row, std::move(text));
+    return true;
+}
+
 void UListCtrl::InsertRows(int row, std::vector<std::wstring> texts) {
     if (texts.empty()) return;
     std::vector<std::string> lines;
     lines.reserve(texts.size());
     for (const std::wstring& text : texts) lines.push_back(nedit::ToUtf8(text));
+    if (events_ != nullptr) events_->RowsAboutToBeInserted(row, static_cast<int>(texts.size()));
     rows_.insert(static_cast<std::size_t>(row), lines);
     RowsAdded(row, static_cast<int>(texts.size()));
 }
 
 void UListCtrl::InsertRow(int row, std::string_view text) {
+    if (events_ != nullptr) events_->RowsAboutToBeInserted(row, 1);
     rows_.insert(static_cast<std::size_t>(row), text);
     RowsAdded(row, 1);
 }
@@ -108,6 +123,7 @@ void UListCtrl::RemoveRows(int row, int count) {
     if (row < 0 || count <= 0) return;
     const auto first = selected_.begin() + row;
     const bool lost_selection = std::find(first, first + count, 1) != first + count;
+    if (events_ != nullptr) events_->RowsAboutToBeRemoved(row, count);
     rows_.erase(static_cast<std::size_t>(row), static_cast<std::size_t>(count));
     RowsChanged();
     selected_.erase(first, first + count);
@@ -128,6 +144,7 @@ void UListCtrl::RemoveRows(int row, int count) {
 }
 
 void UListCtrl::ReplaceRow(int row, const std::wstring& text) {
+    if (events_ != nullptr) events_->RowAboutToChange(row);
     rows_.replace(static_cast<std::size_t>(row), nedit::ToUtf8(text));
     RowsChanged();
     if (events_ != nullptr) events_->RowChanged(row);

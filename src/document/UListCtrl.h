@@ -117,6 +117,12 @@ class UListCtrl : public nedit::RowSource {
     /// All rows as wide text, made when asked for and kept until the rows change: for tests
     /// and short lists. Readers of many rows take GetRowUtf8, which copies nothing.
     const std::vector<std::wstring>& GetRows() const;
+    /// Puts rows back exactly as they were, past the gate, as an undo does: `texts` go in
+    /// before `row` (0 to the row count), unselected. False, with nothing changed, for a row
+    /// out of range.
+    bool RestoreRows(int row, std::vector<std::wstring> texts);
+    /// Gives `row` back the text it had, past the gate. False for a row that does not exist.
+    bool RestoreRowText(int row, std::wstring text);
 
     // ---- Selection and focus. Rows that do not exist are ignored by the setters.
     int GetSelectedCount() const;

@@ -259,6 +259,9 @@ int UNeditDoc::SetupDataBase(const std::wstring& path) {
 void UNeditDoc::StartEngine(UListCtrl* list) {
     Database = std::make_unique<UNeditDatabase>(this, list, SurveyDoc, Host, Progress, L"*CHK");
     Database->SetReportPtr(NReport.get());
+    // The routes of an engine die with it.
+    Routes.ClearTraverseList();
+    Database->AddStage(&Routes);
     for (nedit::RunStage* stage : RunStages) Database->AddStage(stage);
     Database->SetFileName(NeuFileName);  // the bearing store lies beside the neutral file
 }

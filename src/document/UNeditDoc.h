@@ -26,6 +26,9 @@
 #include "report/NeditIni.h"
 #include "report/OutParamStruct.h"
 #include "report/ReportContext.h"
+#include "transfer/PointCodeReader.h"
+#include "transfer/TransferReport.h"
+#include "traverse/TraverseRoutes.h"
 
 class NamelessCoordinates;
 class UListCtrl;
@@ -81,14 +84,32 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     int SetupDataBase(UListCtrl* list);
     /// A new engine runs over a neutral file, read into the document's list.
     int SetupDataBase(const std::wstring& path);
-    /// Adds a stage of a higher room (routes, attachments) to every engine this document
-    /// builds from now on. The stage must outlive the document.
+    /// Adds a stage of a higher room (attachments) to every engine this document builds from
+    /// now on, after its own route discovery. The stage must outlive the document.
     void AddRunStage(nedit::RunStage* stage) { RunStages.push_back(stage); }
+    /// The traverse routes that the last run found, which every engine of the document finds.
+    nedit::TraverseRoutes& GetTraverseRoutes() { return Routes; }
     /// Offers to clear the report, then SetupDataBase(list).
     void Regenerate(UListCtrl* list);
     UNeditDatabase* GetDatabase() const { return Database.get(); }
     /// The text of a new record of that type: its key and the fields of its layout.
     std::wstring FormRecBuf(int recordType) const;
+
+    // ---- Save To Survey (UNeditDocTransfer.cpp) ---------------------------------------------
+    // The transfer lies beside the engine, not beneath it, so the document hands it the
+    // engine's stores: the transfer reads the points, lines and arcs and never the rows.
+    /// The stores of the last reduction into the job, asking through the document's host,
+    /// with its progress and abort flag. 0 without an engine or a job; else as
+    /// nedit::TransferRun::TransferToJob.
+    int TransferToJob();
+    /// The same for the stores of `engine`, which need not be the document's own; `source`
+    /// names them in the job's record of the transfer (empty: the document's name).
+    int TransferToJob(const UNeditDatabase& engine, const std::wstring& source = L"");
+    /// What the last transfer wrote and left out.
+    const nedit::TransferReport& GetTransferReport() const { return LastTransfer; }
+    /// How point codes are read for the transfer; the reader must outlive the document. Null
+    /// (the default) reads them by the job's code grammar.
+    void SetPointCodeReader(const nedit::PointCodeReader* reader) { CodeReader = reader; }
 
     // ---- Report and its parameters ------------------------------------------------------------
     int CreateNReport();
@@ -119,8 +140,8 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     void SetDialogHost(nedit::DialogHost* host);
     nedit::DialogHost* GetDialogHost() const { return Host; }
     nedit::ProgressSink& GetProgress() { return *Progress; }
-    /// Progress and the abort flag go to `sink` from now on (the window's progress bar, the
-    /// terminal); null gives the document its own silent sink back.
+    /// Progress and the abort flag go to `sink` from now on (the desktop's progress bar);
+    /// null gives the document its own silent sink back. The sink must outlive its use.
     void SetProgressSink(nedit::ProgressSink* sink) { Progress = sink ? sink : &OwnProgress; }
     bool GetAbortProcess() const { return Progress->AbortRequested(); }
     void SetAbortProcess(bool abort);
@@ -198,6 +219,7 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     std::wstring NeuFileName;
     std::unique_ptr<UListCtrl> List;
     std::unique_ptr<UNeditDatabase> Database;
+    nedit::TraverseRoutes Routes{*this};
     std::vector<nedit::RunStage*> RunStages;
     std::unique_ptr<UNeditReport> NReport;
     OutParamStruct OutputParameters;
@@ -208,6 +230,8 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     std::unique_ptr<UDeviceManager> DeviceManager;
     unsigned ImportMode = 0;
     std::chrono::milliseconds DownloadTimeOut = kDownloadTimeOut;
+    const nedit::PointCodeReader* CodeReader = nullptr;
+    nedit::TransferReport LastTransfer;
 
     std::vector<XInput*> InputStack;
     std::unique_ptr<XInputOption> Option;

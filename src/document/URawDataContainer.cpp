@@ -82,6 +82,13 @@ std::wstring URawDataContainer::GetUntitledName() const {
     return nedit::Format(L"Data%d", FirstFreeNumber(L"Data", kNameLimit - 1));
 }
 
+UNeditDoc* URawDataContainer::CreateNeditDoc(const std::wstring& name) {
+    if (!name.empty() && TakenNames().count(name) != 0) return nullptr;
+    auto doc = std::make_unique<UNeditDoc>(Job);
+    if (!doc->CreateDocument(name.empty() ? GetUntitledName() : name, this)) return nullptr;
+    return Adopt(std::move(doc));
+}
+
 int URawDataContainer::CreateNEditDocFromNeutralFile(const std::wstring& baseName,
                                                      const std::wstring& path,
                                                      std::wstring* createdName) {

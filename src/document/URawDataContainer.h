@@ -42,6 +42,9 @@ class URawDataContainer : public UDocument {
     std::vector<std::wstring> GetDocumentNames() const;
     /// "Data%d" with the lowest free number from 1; the search ends at 1023.
     std::wstring GetUntitledName() const;
+    /// Makes a new empty document named `name`, or by GetUntitledName when it is empty,
+    /// marked modified; null when the name is taken or its storage cannot be made.
+    UNeditDoc* CreateNeditDoc(const std::wstring& name = L"");
     /// Makes a document of a neutral file (UTF-8) named `baseName` with the lowest free
     /// number from 1 behind it ("Data" when empty). Blank lines of the file are left out: a
     /// blank line would end the stored records when they are read back. 0 when no name is

@@ -1,7 +1,8 @@
 // Points that the engine derived and that must outlive the run go back into the rows as
 // ordinary records: adjusted points below the marker row, addition points above it. These
 // writers touch only the engine's point stores and the rows, so they live beside the engine;
-// what the traverse computes reaches them through those stores.
+// what the traverse computes reaches them through those stores. The traverse points of the
+// last adjustment live here too: the re-reduction of side shots asks for them.
 
 #include "platform/geometry/Tolerance.h"
 #include "platform/text/Format.h"
@@ -81,4 +82,29 @@ void UNeditDatabase::DelAdjPts() {
 
 void UNeditDatabase::ClearAddPtList() {
     AddPtList.Clear();
+}
+
+void UNeditDatabase::UpdateTraversePoints(const std::vector<UNeditPt>* route) {
+    TravPtNames.clear();
+    TravPtKeys.clear();
+    if (route == nullptr) return;
+    for (const UNeditPt& point : *route) {
+        TravPtNames.emplace_back(point.GetID(), point.x, point.y, point.z, L"", 0);
+        TravPtKeys.insert(nedit::ToUpper(point.GetID()));
+    }
+}
+
+bool UNeditDatabase::IsTraversePoint(std::wstring_view name) const {
+    return !TravPtKeys.empty() && TravPtKeys.count(nedit::ToUpper(name)) != 0;
+}
+
+bool UNeditDatabase::GetTraversePoint(UNeditPt& point) const {
+    if (!IsTraversePoint(point.GetID())) return false;
+    for (const UNeditPt& entry : TravPtNames) {
+        if (nedit::EqualsIgnoreCase(entry.GetID(), point.GetID())) {
+            point = UNeditPt(point.GetID(), entry.x, entry.y, entry.z, L"", 0);
+            return true;
+        }
+    }
+    return false;
 }

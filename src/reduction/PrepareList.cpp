@@ -665,7 +665,7 @@ int UNeditDatabase::GetListCount(int& stations, int& sideShots, int& forward) co
     return stations + sideShots + forward;
 }
 
-STNSTRUCT* UNeditDatabase::searchSTN(const std::wstring& name) const {
+STNSTRUCT* UNeditDatabase::searchSTN(std::wstring_view name) const {
     return FirstSetupOf(Names.Find(name));
 }
 

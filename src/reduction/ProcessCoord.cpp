@@ -341,6 +341,8 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
         if (AbortRequested()) return 0;
         UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps),
                        kGeneratingGraphics);
+        // A traverse point keeps the position its adjustment gave it.
+        if (IsTraversePoint(target.SSName)) continue;
         ArrangePtNames(target.PtNames.begin(), target.PtNames.end());
         if (!work.HeadPrinted && work.Printing) {
             if (work.HasShots) Report->PrintSSHead();
@@ -432,6 +434,7 @@ bool UNeditDatabase::HaveSideshotsToReport(const STNSTRUCT* station,
                                            const std::vector<std::wstring>* /*records*/) const {
     if (station == nullptr) return false;
     for (const auto& target : station->SSList) {
+        if (IsTraversePoint(target->SSName)) continue;
         if (!target->PtNames.empty() || !target->ChkShots.empty()) return true;
         if (target->AngleValid && !target->ForwardFlag) return true;
     }

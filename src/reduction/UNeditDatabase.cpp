@@ -160,7 +160,18 @@ void UNeditDatabase::Generate(const std::vector<std::wstring>& rows, bool findRo
         UseForAll = false;
         SetMinMaxCoord();
     }
-    if (result != 0 && findRoutes) RunStages(nedit::RunStep::Routes);
+    if (result != 0 && findRoutes) {
+        // The routes are found in the rows of this run, not in the record list.
+        GivenRows = &rows;
+        RunStages(nedit::RunStep::Routes);
+        GivenRows = nullptr;
+    }
+}
+
+nedit::RunRows UNeditDatabase::GetRunRows() const {
+    static const std::vector<std::wstring> no_rows;
+    if (GivenRows != nullptr) return nedit::RunRows(*GivenRows);
+    return Rows != nullptr ? nedit::RunRows(*Rows) : nedit::RunRows(no_rows);
 }
 
 nedit::TextLines UNeditDatabase::ContentRows() const {

@@ -41,6 +41,7 @@
 #include "reduction/CheckResult.h"
 #include "reduction/ObservationModel.h"
 #include "reduction/RowIndex.h"
+#include "reduction/RunRows.h"
 #include "reduction/RunStage.h"
 #include "reduction/StationList.h"
 
@@ -102,6 +103,9 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
         Rows = rows;
         RowIndexes.clear();
     }
+    /// The rows a run reads: while Generate runs, the rows it was given; otherwise those of
+    /// the record list. Empty without either.
+    nedit::RunRows GetRunRows() const;
     void SetReportPtr(UNeditReport* report) { Report = report; }
     UNeditReport* GetReport() const { return Report; }
     void SetFileName(const std::wstring& name) { FileName = name; }
@@ -149,7 +153,7 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     int DeleteList();
     int GetListCount(int& stations, int& sideShots, int& forward) const;
     /// The first station of that exact name that is not a point-only node, or null.
-    STNSTRUCT* searchSTN(const std::wstring& name) const;
+    STNSTRUCT* searchSTN(std::wstring_view name) const;
     /// All such stations, the names compared without regard to case.
     int SearchSTN(const std::wstring& name, std::vector<STNSTRUCT*>& out) const;
     void InitUnitsAndAngleModes();
@@ -168,6 +172,8 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     USurveyDoc* GetSurveyDoc() const { return SurveyDoc; }
     void SetCurHMode(wchar_t mode) { HMode = mode; }
     void SetTravFlag(int flag) { TravFlag = flag; }
+    /// The text that marks a check shot in a code; empty while no code settings are loaded.
+    const std::wstring& GetChkShotCode() const { return ChkShotCode; }
     const std::wstring& GetDateText() const { return DateText; }
 
     // ---- Averaging --------------------------------------------------------------------
@@ -196,6 +202,8 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     /// 1 when the job has the point and it loads, with its values and code.
     int GetCoordFromSvyDoc(const std::wstring& name, double& e, double& n, double& z,
                            std::wstring& code) const;
+    /// The names for which the user took the job's coordinates in this run.
+    const std::set<std::wstring, std::less<>>& GetDbCoordNames() const { return DbCoordNames; }
     /// The job has a point of that name (whether or not it loads).
     bool JobHasPoint(const std::wstring& name) const;
     /// Coordinates are shown Easting first: the job's setting, and so without a job.
@@ -276,6 +284,14 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     /// Forgets the adjusted points and deletes the rows from the lowest marker down.
     void DelAdjPts();
     void ClearAddPtList();
+    /// The positions of the last adjusted route become the traverse points, which the
+    /// re-reduction of side shots leaves where the adjustment put them. Null forgets them.
+    void UpdateTraversePoints(const std::vector<UNeditPt>* route);
+    /// The name is one of the traverse points, compared without regard to case.
+    bool IsTraversePoint(std::wstring_view name) const;
+    /// When `point`'s name is a traverse point: `point` becomes it (its name, position, no
+    /// code, no flags) and true is given.
+    bool GetTraversePoint(UNeditPt& point) const;
 
     const std::vector<UNeditPt>& GetPointList() const { return PointList.Items(); }
     const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList.Items(); }
@@ -488,6 +504,7 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     bool Output = false;
     int ErrorCode = 0;
     nedit::TextLines ContentLines;
+    const std::vector<std::wstring>* GivenRows = nullptr;  // Generate's rows, while it runs
 
     // The observation model. Names and codes keep their ids for the life of the engine.
     nedit::NameTable Names;
@@ -536,6 +553,9 @@ class UNeditDatabase : private nedit::CodeGeometryHost {
     std::vector<std::shared_ptr<const std::wstring>> CodeTexts;  // by code id
     nedit::PointStore AddPtList;
     nedit::PointStore TravPtList;
+    // The last adjusted route's points, and their names upper-cased for the look-up.
+    std::vector<UNeditPt> TravPtNames;
+    std::unordered_set<std::wstring> TravPtKeys;
     nedit::LineStore LineList;
     nedit::ArcStore ArcList;
     std::vector<UNeditCircle> CircleList;

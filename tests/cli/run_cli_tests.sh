@@ -184,6 +184,14 @@ cp "$work/small.neu" "$work/in.neu"
 same doc-export-onto-job "$work/docs.job" -- "$sxnedit" doc export "$work/docs.job" "FIELD DAY" "$work/docs.job"
 same export-points-onto-job "$work/site.job" -- "$sxnedit" job export-points "$work/site.job" "$work/site.job"
 same report-onto-input "$work/in.neu" -- "$sxnedit" reduce "$work/in.neu" --report "$work/in.neu"
+# A field file named DEBUG.DAT in the working directory would be removed by the reduction.
+cp "$work/in.neu" "$work/DEBUG.DAT"
+cd "$work"
+check debug-dat-input-kept 1 /dev/null \
+    "sxnedit: cannot read DEBUG.DAT: it is DEBUG.DAT of the working directory, which every reduction removes; give it another name or run from another folder" -- \
+    "$sxnedit" reduce DEBUG.DAT
+cd - >/dev/null
+[ -f "$work/DEBUG.DAT" ] && passed=$((passed + 1)) || { echo "FAIL debug-dat-kept"; failed=$((failed + 1)); }
 same points-onto-input "$work/in.neu" -- "$sxnedit" reduce "$work/in.neu" --points "$work/in.neu"
 ln -s in.neu "$work/link.neu"
 same points-onto-link-to-input "$work/in.neu" -- "$sxnedit" reduce "$work/link.neu" --points "$work/in.neu"

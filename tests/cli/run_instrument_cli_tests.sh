@@ -14,7 +14,7 @@ no_station="sxnedit: The data hold observations before any station block; they a
 
 check instruments 0 "$here/expected/instruments.txt" "" -- "$sxnedit" instruments
 check instruments-usage 64 /dev/null "" -- "$sxnedit" instruments --all
-"$sxnedit" instruments --json | python3 -c 'import json, sys; d = json.load(sys.stdin); assert [x["name"] for x in d["drivers"]] == ["Leica GSI", "Neutral"] and d["drivers"][0]["extensions"] == ["gsi", "gs8", "gs16"] and d["refused"] == []' &&
+"$sxnedit" instruments --json | python3 -c 'import json, sys; d = json.load(sys.stdin); names = [x["name"] for x in d["drivers"]]; assert len(names) == 10 and "Carlson RW5" in names and d["drivers"][names.index("Leica GSI")]["extensions"] == ["gsi", "gs8", "gs16"] and d["refused"] == []' &&
     passed=$((passed + 1)) || { echo "FAIL instruments-json"; failed=$((failed + 1)); }
 
 check import-stdout 0 "$here/expected/rilievo-gon.neu" "$no_station" -- "$sxnedit" import "$raw/RILIEVO.gsi" --instrument "leica gsi" --angles gon
@@ -26,7 +26,7 @@ check import-job 0 "$work/imported" "" -- "$sxnedit" import "$raw/RILIEVO.gsi" -
 check import-job-export 0 "" "" -- "$sxnedit" doc export "$work/site.job" "DAY 1" "$work/day1.neu"
 check import-job-rows 0 "$here/expected/rilievo-gon.neu" "" -- cat "$work/day1.neu"
 check import-name-taken 1 /dev/null "sxnedit: the job has a document DAY 1 already" -- "$sxnedit" import "$raw/RILIEVO.gsi" --instrument "Leica GSI" --job "$work/site.job" --name "DAY 1"
-check import-unknown-instrument 1 /dev/null "sxnedit: There is no driver for Total. The drivers are: Leica GSI, Neutral." -- "$sxnedit" import "$raw/RILIEVO.gsi" --instrument Total
+check import-unknown-instrument 1 /dev/null "sxnedit: There is no driver for Total. The drivers are: Trimble ARE, Leica GSI, Topcon GTS, Neutral, Nikon RAW v2.00, Carlson RW5, Sokkia SDR33, Leica TPS 1200 export, Leica TPS 700 export, Zeiss R4/R5/Rec 500." -- "$sxnedit" import "$raw/RILIEVO.gsi" --instrument Total
 check import-missing-file 2 /dev/null "sxnedit: Failed to open $work/none.gsi: No such file or directory." -- "$sxnedit" import "$work/none.gsi" --instrument "Leica GSI"
 check import-other-format 2 /dev/null "sxnedit: The data are not Leica GSI: no GSI word was found in them.
 sxnedit: $work/rilievo.neu gave no records" -- "$sxnedit" import "$work/rilievo.neu" --instrument "Leica GSI"
@@ -44,6 +44,10 @@ check download-no-port 64 /dev/null "sxnedit: download: --port is required
 Usage: sxnedit download [OPTIONS]
 Run 'sxnedit download --help' for more information." -- "$sxnedit" download --instrument "Leica GSI"
 check download-bad-parity 64 /dev/null "" -- "$sxnedit" download --instrument "Leica GSI" --port COM1 --parity maybe
+
+# The RW5 traverse imported and reduced: its stations where the data collector put them.
+python3 "$here/rw5_traverse.py" "$sxnedit" "$raw/Trav_19leg.rw5" "$work" &&
+    passed=$((passed + 1)) || { echo "FAIL rw5-traverse"; failed=$((failed + 1)); }
 
 # A download end to end: the instrument plays RILIEVO.gsi and ends with EOT; the records go
 # to a file and the raw data are kept.

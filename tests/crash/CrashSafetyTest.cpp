@@ -1,4 +1,5 @@
-// kill -9 at random moments of the commands that change a job: afterwards the job passes
+// kill -9 at random moments of the commands that change a job (a document's import and
+// rename, an import of points, a transfer of a reduced survey): afterwards the job passes
 // PRAGMA integrity_check and holds the state before the command or the state after it, whole.
 // And two programs importing into one job at once: each document keeps a name of its own.
 // The program under test is the sxnedit that the build made (SXNEDIT_PROGRAM), or another one
@@ -163,6 +164,12 @@ TEST_F(CrashSafety, JobImportPoints) {
     const std::string job = dir.File("before.job");
     ASSERT_EQ(RunToEnd({"job", "new", job}), 0);
     KillAtRandom(job, {"job", "import-points", dir.File("work.job"), dir.File("points.csv")});
+}
+
+TEST_F(CrashSafety, Transfer) {
+    const std::string job = dir.File("before.job");
+    ASSERT_EQ(RunToEnd({"job", "new", job}), 0);
+    KillAtRandom(job, {"transfer", dir.File("field.neu"), "--job", dir.File("work.job")});
 }
 
 TEST_F(CrashSafety, TwoImportsAtOnceTakeTwoNames) {

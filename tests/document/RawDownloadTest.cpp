@@ -32,7 +32,7 @@ class RawDownload : public InstrumentDocFixture {
 
     std::string raw = dir.File("OUTTEMP.$$$");
     std::string rilievo;
-    // Last, so that it is gone first: its thread, which reads the text above, is joined then.
+    // Last, so that its thread, which reads the members above, is joined before they go.
     FakeInstrument instrument;
 };
 

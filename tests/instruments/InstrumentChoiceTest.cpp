@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 #include "../support/TestSupport.h"
 #include "instruments/PortStores.h"
 #include "instruments/UDeviceManager.h"
@@ -14,19 +16,22 @@ TEST(ULoadRawDlg, StartsOnTheRememberedInstrumentAndRemembersTheChoice) {
     nedit::test::TempDir dir;
     nedit::test::ScopedEnv config("SXNEDIT_CONFIG", dir.Path());
     UDeviceManager manager(L"", 0, false, SXNEDIT_TEST_DRIVER_DIR);
+    std::vector<std::wstring> names;
+    manager.GetNameList(names);
+    const auto neutral = std::find(names.begin(), names.end(), L"Neutral");
+    ASSERT_NE(neutral, names.end());
     {
         ULoadRawDlg dialog(&manager);
         dialog.OnInitDialog();
         EXPECT_EQ(dialog.GetSelected(), 0);  // nothing remembered: every name begins with it
-        EXPECT_EQ(dialog.GetDetails(),
-                  L"Leica GSI-8 and GSI-16 measurement, station and code blocks");
+        EXPECT_EQ(dialog.GetDetails(), manager.GetDeviceDescription(names.front()));
         EXPECT_FALSE(dialog.OnOK());
         EXPECT_EQ(dialog.GetEndCode(), nedit::mb::IdCancel);
     }
     nedit::InstrumentProfile().WriteInstrument(L"neu");
     ULoadRawDlg dialog(&manager);
     dialog.OnInitDialog();
-    EXPECT_EQ(dialog.GetSelected(), 1);
+    EXPECT_EQ(dialog.GetSelected(), neutral - names.begin());
     EXPECT_EQ(dialog.OnButton(ULoadRawDlg::kImport), ULoadRawDlg::kImport);
     EXPECT_EQ(dialog.Device, L"Neutral");
     EXPECT_EQ(nedit::InstrumentProfile().ReadInstrument(), L"Neutral");

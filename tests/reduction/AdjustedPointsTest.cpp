@@ -52,3 +52,32 @@ TEST_F(AdjustedPoints, AdjustedPointsFollowAMarkerMadeForThem) {
     engine.DelAdjPts();
     EXPECT_EQ(list.GetItemCount(), 2);
 }
+
+TEST_F(AdjustedPoints, TraversePointsAreTheLastAdjustedRoute) {
+    EXPECT_FALSE(engine.IsTraversePoint(L"A"));
+    const std::vector<UNeditPt> route = {UNeditPt(L"A", 1.0, 2.0, 3.0, L"STN", 0),
+                                         UNeditPt(L"b", 4.0, 5.0, kNoHeight, L"", 0)};
+    engine.UpdateTraversePoints(&route);
+    EXPECT_TRUE(engine.IsTraversePoint(L"a"));
+    EXPECT_TRUE(engine.IsTraversePoint(L"B"));
+    EXPECT_FALSE(engine.IsTraversePoint(L"C"));
+    UNeditPt asked(L"B", 0.0, 0.0, 0.0, L"KEEP", UNeditPt::kFromPTRecord);
+    ASSERT_TRUE(engine.GetTraversePoint(asked));
+    EXPECT_EQ(asked.GetID(), L"B");
+    EXPECT_DOUBLE_EQ(asked.x, 4.0);
+    EXPECT_EQ(asked.z, kNoHeight);
+    EXPECT_EQ(asked.GetCode(), L"");
+    EXPECT_EQ(asked.GetFlags(), 0u);
+    UNeditPt unknown(L"C", 0.0, 0.0, 0.0, L"", 0);
+    EXPECT_FALSE(engine.GetTraversePoint(unknown));
+    // The side shots of a re-reduction leave them where the adjustment put them.
+    Rows(
+        L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\nSTN ID=K,HI=1.5\nXYZ ID=K,E=0,N=0,H=0\n"
+        L"BKB ID=Z,BRG=0,HA=0\nSS ID=A,HA=90,VA=90,SD=10,HT=1.5\nSS "
+        L"ID=Q,HA=0,VA=90,SD=10,HT=1.5\n");
+    ASSERT_EQ(engine.Process(), 1);
+    EXPECT_EQ(engine.GetPointIdx(L"A"), -1);
+    EXPECT_GE(engine.GetPointIdx(L"Q"), 0);
+    engine.UpdateTraversePoints(nullptr);
+    EXPECT_FALSE(engine.IsTraversePoint(L"A"));
+}

@@ -83,3 +83,22 @@ TEST_F(RunStages, ARunWithoutStagesGivesTheSamePoints) {
         EXPECT_DOUBLE_EQ(staged.GetPointList()[i].y, alone[i].y);
     }
 }
+
+TEST_F(RunStages, TheRoutesStepReadsTheRowsOfItsRun) {
+    // The list holds the survey; Generate is given it with a note more.
+    class RowCounter : public nedit::RunStage {
+      public:
+        void Run(UNeditDatabase& engine, nedit::RunStep) override {
+            counts.push_back(engine.GetRunRows().size());
+        }
+        std::vector<std::size_t> counts;
+    } stage;
+    engine.AddStage(&stage);
+    Rows(kSurvey);
+    std::vector<std::wstring> rows = list.GetRows();
+    rows.push_back(L"NOTE      GIVEN");
+    engine.Regenerate();
+    engine.Generate(rows, true);
+    EXPECT_EQ(stage.counts, (std::vector<std::size_t>{6, 7}));
+    EXPECT_EQ(engine.GetRunRows().size(), 6u);
+}

@@ -22,6 +22,8 @@ void AddRowsCommand(CLI::App& app, CommandRun& run);
 void AddReduceCommand(CLI::App& app, CommandRun& run);
 void AddJobCommands(CLI::App& app, CommandRun& run);
 void AddDocCommands(CLI::App& app, CommandRun& run);
+void AddTraverseCommands(CLI::App& app, CommandRun& run);
+void AddTransferCommand(CLI::App& app, CommandRun& run);
 void AddInstrumentsCommand(CLI::App& app, CommandRun& run);
 void AddImportCommand(CLI::App& app, CommandRun& run);
 void AddDownloadCommand(CLI::App& app, CommandRun& run);

@@ -6,6 +6,9 @@
 #include "platform/text/WideText.h"
 #include "reduction/UBKBCoordDlg.h"
 #include "reduction/UCoordEntryDlg.h"
+#include "transfer/DuplicatePtsDlg.h"
+#include "transfer/LockedLayersQuestion.h"
+#include "transfer/UOverridePolyDlg.h"
 
 namespace {
 
@@ -50,6 +53,15 @@ ConsoleDialogHost::ConsoleDialogHost(bool interactive, bool echo)
     SetFace<UBKBCoordDlg>([this](UBKBCoordDlg& dialog) {
         return Interactive ? AskBackStation(dialog) : Accept(dialog);
     });
+    SetFace<DuplicatePtsDlg>([this](DuplicatePtsDlg& dialog) {
+        return Interactive ? AskDuplicatePoint(dialog) : Accept(dialog);
+    });
+    SetFace<UOverridePolyDlg>([this](UOverridePolyDlg& dialog) {
+        return Interactive ? AskOverrideString(dialog) : Accept(dialog);
+    });
+    SetFace<nedit::LockedLayersQuestion>([this](nedit::LockedLayersQuestion& question) {
+        return Interactive ? AskLockedLayers(question) : Accept(question);
+    });
 }
 
 int ConsoleDialogHost::ShowMessage(const std::wstring& text, unsigned flags, unsigned /*help*/) {
@@ -70,6 +82,56 @@ std::string ConsoleDialogHost::ReadAnswer(const std::string& prompt) {
     std::string line;
     if (!std::getline(std::cin, line)) return {};
     return nedit::ToUtf8(nedit::Trim(nedit::FromUtf8(line)));
+}
+
+bool ConsoleDialogHost::InputEnded() const {
+    return !std::cin.good();
+}
+
+int ConsoleDialogHost::AskDuplicatePoint(DuplicatePtsDlg& dialog) {
+    std::fprintf(stderr, "%s\n%s\n", nedit::ToUtf8(dialog.DialogName()).c_str(),
+                 nedit::ToUtf8(dialog.Message).c_str());
+    do {
+        if (InputEnded()) return nedit::mb::IdCancel;
+        std::fprintf(stderr,
+                     "  o  Overwrite\n  n  Create with a new number: %s\n  p  Create new with a "
+                     "prefix: %s\n  a  Abort\n",
+                     nedit::ToUtf8(dialog.NewNumber).c_str(), nedit::ToUtf8(dialog.Prefix).c_str());
+        const char* const keys = " opn";
+        const std::string choice =
+            ReadAnswer(std::string("Choice [") +
+                       keys[dialog.Mode < 1 || dialog.Mode > 3 ? 1 : dialog.Mode] + "]: ");
+        if (choice == "a") return nedit::mb::IdCancel;
+        if (choice == "o") dialog.Choose(DuplicatePtsDlg::kOverwrite);
+        if (choice == "p") dialog.Choose(DuplicatePtsDlg::kPrefix);
+        if (choice == "n") dialog.Choose(DuplicatePtsDlg::kNewNumber);
+        if (dialog.IsPrefixEditEnabled()) {
+            const std::string prefix =
+                ReadAnswer("Prefix [" + nedit::ToUtf8(dialog.Prefix) + "]: ");
+            if (!prefix.empty()) dialog.Prefix = nedit::FromUtf8(prefix);
+        }
+        if (dialog.IsNumberEditEnabled()) {
+            const std::string number =
+                ReadAnswer("New number [" + nedit::ToUtf8(dialog.NewNumber) + "]: ");
+            if (!number.empty()) dialog.NewNumber = nedit::FromUtf8(number);
+        }
+        dialog.ApplyAll = ReadAnswer("Apply this method to the rest of the process? [y/N] ") == "y";
+    } while (!dialog.OnOK());
+    return dialog.EndCode();
+}
+
+int ConsoleDialogHost::AskOverrideString(UOverridePolyDlg& dialog) {
+    std::fprintf(stderr, "%s\n", nedit::ToUtf8(dialog.GetMessage()).c_str());
+    const std::string answer = ReadAnswer("[y Yes/n No] (default No) ");
+    dialog.ApplyAll = ReadAnswer("Apply to All? [y/N] ") == "y";
+    return answer == "y" ? dialog.OnYes() : dialog.OnNo();
+}
+
+int ConsoleDialogHost::AskLockedLayers(nedit::LockedLayersQuestion& question) {
+    return AskMessage(question.GetMessage(), nedit::mb::OkCancel | nedit::mb::IconQuestion) ==
+                   nedit::mb::IdOk
+               ? nedit::mb::IdOk
+               : nedit::mb::IdCancel;
 }
 
 int ConsoleDialogHost::AskMessage(const std::wstring& text, unsigned flags) {

@@ -3,8 +3,9 @@
 // coordinates come from the job if it offers them, else from the field records, else the
 // entered values; every message box takes its default button. With `interactive` it asks
 // on the terminal instead. Every message shown is kept, in order, for the JSON output.
-// It has faces for the coordinate and back-bearing dialogs; every other dialog is accepted
-// as it stands.
+// It has faces for the coordinate and back-bearing dialogs and for the questions of a
+// transfer to the job (a point of other coordinates, a polyline of the same name, locked
+// layers); every other dialog is accepted as it stands.
 
 #include <cstdio>
 #include <string>
@@ -12,8 +13,13 @@
 
 #include "platform/messages/DialogHost.h"
 
+class DuplicatePtsDlg;
 class UBKBCoordDlg;
 class UCoordEntryDlg;
+class UOverridePolyDlg;
+namespace nedit {
+class LockedLayersQuestion;
+}
 
 class ConsoleDialogHost : public nedit::DialogHost {
   public:
@@ -26,6 +32,11 @@ class ConsoleDialogHost : public nedit::DialogHost {
     void SetEcho(bool echo) { Echo = echo; }
     const std::vector<std::wstring>& Messages() const { return MessagesShown; }
 
+    /// The questions of a transfer, asked on the terminal; each gives how the dialog ended.
+    int AskDuplicatePoint(DuplicatePtsDlg& dialog);
+    int AskOverrideString(UOverridePolyDlg& dialog);
+    int AskLockedLayers(nedit::LockedLayersQuestion& question);
+
   protected:
     int Show(nedit::UDialogLogic& dialog, const Face* face) override;
 
@@ -33,8 +44,9 @@ class ConsoleDialogHost : public nedit::DialogHost {
     int AskMessage(const std::wstring& text, unsigned flags);
     int AskCoordinates(UCoordEntryDlg& dialog);
     int AskBackStation(UBKBCoordDlg& dialog);
-    /// A line from the terminal; empty at the end of input.
+    /// A line from the terminal; empty at the end of input, after which InputEnded holds.
     std::string ReadAnswer(const std::string& prompt);
+    bool InputEnded() const;
 
     bool Interactive;
     bool Echo;

@@ -11,6 +11,9 @@
 #include "ConsoleDialogHost.h"
 #include "ReductionOutput.h"
 #include "RunFiles.h"
+#include "SurveyTransfer.h"
+#include "TraverseOptions.h"
+#include "TraverseRun.h"
 #include "document/UListCtrl.h"
 #include "document/URawDataContainer.h"
 #include "platform/job/JobError.h"
@@ -108,6 +111,49 @@ int Reduce(OpenJob& open, const std::string& name, const std::string& report, bo
     return result == 1 ? exit_status::Ok : exit_status::Failed;
 }
 
+int Traverse(OpenJob& open, const std::string& name, const TraverseOptions& options) {
+    TraverseRequest request;
+    if (!ReadRequest(options, request)) return exit_status::Unreadable;
+    UNeditDoc* doc = Find(open, name);
+    if (doc == nullptr) return exit_status::Failed;
+    open.host.SetEcho(!options.json);
+    UListCtrl& list = doc->OpenList();
+    doc->SetupDataBase(&list);
+    const TraverseOutcome outcome =
+        RunTraverse(*doc->GetDatabase(), doc->GetTraverseRoutes(), open.host, request);
+    // Stored as the pane stores it after a traverse: adjusted points into the rows first.
+    if (!doc->SaveDocument()) {
+        std::fprintf(stderr, "sxnedit: the document %s could not be stored\n", name.c_str());
+        return exit_status::Failed;
+    }
+    const int status = WriteTraverseOutput(outcome, doc->GetNReport(), options, open.host,
+                                           doc->GetSettings().GetLengthDecimals());
+    if (!options.save.empty() && !doc->Save(Wide(options.save), &list)) {
+        std::fprintf(stderr, "sxnedit: cannot write %s\n", options.save.c_str());
+        return exit_status::Failed;
+    }
+    return status;
+}
+
+int Transfer(OpenJob& open, const std::string& name, const SurveyTransferOptions& options) {
+    UNeditDoc* doc = Find(open, name);
+    if (doc == nullptr) return exit_status::Failed;
+    open.host.SetEcho(!options.json);
+    open.host.SetInteractive(options.interactive);
+    UListCtrl& list = doc->OpenList();
+    const int reduced = doc->SetupDataBase(&list);
+    // Addition points went into the rows; they are kept with the document.
+    doc->SaveDocument();
+    if (reduced != 1) {
+        std::fprintf(stderr,
+                     "sxnedit: the reduction of %s did not reach its end; nothing was saved to "
+                     "the job\n",
+                     name.c_str());
+        return exit_status::Failed;
+    }
+    return SaveToSurvey(*doc, *doc->GetDatabase(), open.host, options);
+}
+
 int Rename(OpenJob& open, const std::string& from, const std::string& to) {
     if (open.container->HasName(Wide(to))) {
         std::fprintf(stderr, "sxnedit: the job has a document %s already\n", to.c_str());
@@ -133,6 +179,8 @@ struct DocOptions {
     std::string other;   // the neutral file of an import, the new name of a rename
     std::string output;  // the file of an export, the report of a reduction
     bool json = false;
+    TraverseOptions traverse;
+    SurveyTransferOptions transfer;
 };
 
 /// A doc command that opens the job and then does `work` on it.
@@ -143,7 +191,13 @@ CLI::App* AddDocCommand(CLI::App& doc, CommandRun& run, const std::shared_ptr<Do
     command->add_option("JOB", options->job, "the job file")->required();
     command->callback([options, work, &run] {
         run = [options, work] {
-            if (!RunFiles().Reads(options->job).Writes(options->output).Check()) {
+            if (!RunFiles()
+                     .Reads(options->job)
+                     .Reads(options->traverse.params)
+                     .Writes(options->output)
+                     .Writes(options->traverse.report)
+                     .Writes(options->traverse.save)
+                     .Check()) {
                 return exit_status::Failed;
             }
             OpenJob open;
@@ -188,6 +242,24 @@ void AddDocCommands(CLI::App& app, CommandRun& run) {
     reduce->add_flag("--json", options->json, "print the reduction's results as JSON");
     reduce->parse_complete_callback(
         [options] { CheckOutputOptions(options->output, options->json); });
+
+    CLI::App* traverse = AddDocCommand(
+        *doc, run, options, "traverse",
+        "reduce a stored document, adjust a traverse as 'traverse\n"
+        "adjust' does, and store the document",
+        [](OpenJob& open, const DocOptions& o) { return Traverse(open, o.name, o.traverse); });
+    traverse->add_option("NAME", options->name, "the document")->required();
+    AddTraverseOptions(*traverse, options->traverse);
+    traverse->parse_complete_callback(
+        [options] { CheckOutputOptions(options->traverse.report, options->traverse.json); });
+
+    CLI::App* transfer = AddDocCommand(
+        *doc, run, options, "transfer",
+        "reduce a stored document and save its points, lines,\n"
+        "arcs, circles and strings to the job (\"Save To Survey\")",
+        [](OpenJob& open, const DocOptions& o) { return Transfer(open, o.name, o.transfer); });
+    transfer->add_option("NAME", options->name, "the document")->required();
+    AddSurveyTransferOptions(*transfer, options->transfer);
 
     CLI::App* rename = AddDocCommand(
         *doc, run, options, "rename", "give a document another name",

@@ -51,8 +51,12 @@ int ListInstruments(const InstrumentsOptions& options) {
     if (options.json) {
         PrintJson(drivers);
     } else {
+        // The names in a column as wide as the longest of them.
+        int width = 0;
+        for (const nedit::DriverInfo& driver : drivers.Drivers())
+            width = std::max(width, static_cast<int>(nedit::ToUtf8(driver.name).size()));
         for (const nedit::DriverInfo& driver : drivers.Drivers()) {
-            std::printf("%-12s %s (%s)\n", nedit::ToUtf8(driver.name).c_str(),
+            std::printf("%-*s %s (%s)\n", width, nedit::ToUtf8(driver.name).c_str(),
                         nedit::ToUtf8(driver.description).c_str(),
                         nedit::ToUtf8(driver.extensions).c_str());
         }

@@ -3,12 +3,14 @@
 #include <CLI/CLI.hpp>
 #include <cstdio>
 #include <functional>
+#include <iterator>
 #include <map>
 #include <memory>
 #include <string>
 #include <vector>
 
 #include "Commands.h"
+#include "JobListings.h"
 #include "PointOutput.h"
 #include "RunFiles.h"
 #include "platform/io/LineReader.h"
@@ -225,6 +227,7 @@ int Info(const std::string& path) {
     Print(nedit::Format(L"Layers:         %lld\n", Count(*job, "SELECT count(*) FROM layer")));
     Print(
         nedit::Format(L"Survey codes:   %lld\n", Count(*job, "SELECT count(*) FROM survey_code")));
+    Print(nedit::Format(L"Transfers:      %lld\n", Count(*job, "SELECT count(*) FROM transfer")));
     Print(nedit::Format(L"Raw-data files: %lld\n",
                         Count(*job, "SELECT count(*) FROM storage WHERE parent_id IS NOT NULL")));
     return exit_status::Ok;
@@ -255,6 +258,26 @@ void AddJobCommands(CLI::App& app, CommandRun& run) {
     add("points", "list the job's points", [](const JobOptions& o) {
         return Points(o.job, o.json);
     })->add_flag("--json", options->json, "objects with id, e, n, h (null: no height) and code");
+    struct Listing {
+        const char* name;
+        int (*list)(const std::string&, bool);
+        const char* jsonHelp;
+    };
+    const Listing listings[] = {
+        {"polylines", ListPolylines,
+         "objects with name, layer, closed and vertices (id, e, n,\nh (null: no height), bulge)"},
+        {"lines", ListLines, "objects with the two ends from and to (id, e, n, h) and\nthe layer"},
+        {"arcs", ListArcs, "objects with start, end, centre, radius, sense and layer"},
+        {"circles", ListCircles, "objects with centre (id, e, n, h), radius and layer"},
+        {"transfers", ListTransfers,
+         "objects with made_at, source, complete, written (counts)\nand not_written (kind, "
+         "name, reason)"}};
+    for (const Listing& listing : listings) {
+        const auto list = listing.list;
+        add(listing.name, (std::string("list the job's ") + listing.name).c_str(),
+            [list](const JobOptions& o) { return list(o.job, o.json); })
+            ->add_flag("--json", options->json, listing.jsonHelp);
+    }
     add("import-points",
         "add or update points from name,east,north,height,code\n"
         "rows (empty height: none; a later row of a name wins)",

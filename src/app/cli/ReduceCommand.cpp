@@ -12,8 +12,6 @@
 #include "RecordSession.h"
 #include "ReductionOutput.h"
 #include "RunFiles.h"
-#include "platform/job/JobError.h"
-#include "platform/job/USurveyDoc.h"
 #include "platform/text/WideText.h"
 #include "report/OutParamStruct.h"
 
@@ -63,36 +61,20 @@ int Reduce(const ReduceOptions& options) {
              .Check()) {
         return exit_status::Failed;
     }
-    std::unique_ptr<USurveyDoc> job;
-    if (!options.job.empty()) {
-        try {
-            job = USurveyDoc::OpenJob(options.job);
-        } catch (const nedit::JobError& error) {
-            std::fprintf(stderr, "sxnedit: %s\n", error.what());
-            return exit_status::Unreadable;
-        }
-    }
     RecordSession session;
     session.host.SetInteractive(options.interactive);
-    session.host.SetEcho(!options.json);
-    if (!session.Start(job.get())) return exit_status::Failed;
+    const int started = session.Start(options.job, options.json);
+    if (started != exit_status::Ok) return started;
     OutParamStruct& parameters = session.doc->GetOutputParameters();
     if (!options.angles.empty()) parameters.AngularUnit = IndexOf(kAngleUnits, options.angles);
     if (!options.lengths.empty()) parameters.LinearUnit = IndexOf(kLengthUnits, options.lengths);
     if (options.columns_given) SetFlagsFromOrder(parameters, nedit::FromUtf8(options.columns));
 
-    UNeditDatabase& engine = session.StartEngine();
+    if (!session.Load(options.file, options.json)) return exit_status::Unreadable;
+    UNeditDatabase& engine = *session.engine;
     // A report nobody asked for is still made, since it takes part in the reduction, but its
     // text is not kept.
     session.report->SetKeepText(!options.report.empty());
-    if (!engine.LoadNeFile(nedit::FromUtf8(options.file))) {
-        if (options.json) {
-            for (const std::wstring& message : session.host.Messages()) {
-                std::fprintf(stderr, "sxnedit: %s\n", nedit::ToUtf8(message).c_str());
-            }
-        }
-        return exit_status::Unreadable;
-    }
     const int result = engine.Process();
     ReductionOutputs outputs;
     outputs.report = options.report;

@@ -234,16 +234,21 @@ void CheckOutputOptions(const std::string& reportPath, bool json) {
     }
 }
 
+bool WriteReport(const UNeditReport* report, const std::string& path) {
+    if (report == nullptr || path.empty()) return true;
+    if (path == "-") {
+        PrintReport(*report);
+        return true;
+    }
+    if (report->SaveAsText(path)) return true;
+    std::fprintf(stderr, "sxnedit: cannot write %s\n", path.c_str());
+    return false;
+}
+
 int WriteReductionOutput(const UNeditDatabase& engine, const UNeditReport* report,
                          const ReductionOutputs& outputs, ConsoleDialogHost& host) {
     const bool left_out = TellNonFinite(engine, host);
-    if (report != nullptr && outputs.report == "-") {
-        PrintReport(*report);
-    } else if (report != nullptr && !outputs.report.empty() &&
-               !report->SaveAsText(outputs.report)) {
-        std::fprintf(stderr, "sxnedit: cannot write %s\n", outputs.report.c_str());
-        return exit_status::Failed;
-    }
+    if (!WriteReport(report, outputs.report)) return exit_status::Failed;
     if (outputs.json) {
         WriteReductionJson(engine, host.Messages(), Print);
     } else if (outputs.report != "-") {

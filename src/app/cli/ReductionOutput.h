@@ -27,6 +27,10 @@ bool WriteReductionJson(const UNeditDatabase& engine, const std::vector<std::wst
 /// Throws CLI::ValidationError when the JSON and the report would both go to standard output.
 void CheckOutputOptions(const std::string& reportPath, bool json);
 
+/// Writes the report to `path`, "-" to standard output; nothing without a report or a path.
+/// False, after a message, when the file cannot be written.
+bool WriteReport(const UNeditReport* report, const std::string& path);
+
 /// Where a reduction's results go.
 struct ReductionOutputs {
     std::string report;  // a file, "-" for standard output, empty for none

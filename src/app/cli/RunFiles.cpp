@@ -8,6 +8,9 @@
 
 namespace {
 
+// The file that every engine removes from the working directory as it starts.
+constexpr const char* kEngineScratchFile = "DEBUG.DAT";
+
 bool SameFile(const std::string& a, const std::string& b) {
     struct stat first {};
     struct stat second {};
@@ -33,6 +36,16 @@ RunFiles& RunFiles::Writes(const std::string& path) {
 }
 
 bool RunFiles::Check() const {
+    for (const std::string& input : inputs_) {
+        if (SameFile(input, kEngineScratchFile)) {
+            std::fprintf(stderr,
+                         "sxnedit: cannot read %s: it is %s of the working directory, which "
+                         "every reduction removes; give it another name or run from another "
+                         "folder\n",
+                         input.c_str(), kEngineScratchFile);
+            return false;
+        }
+    }
     for (std::size_t i = 0; i < outputs_.size(); ++i) {
         const std::string& output = outputs_[i];
         for (const std::string& input : inputs_) {

@@ -4,6 +4,9 @@
 // an output never replaces an input of the same run, two outputs never fall on one file, and
 // an output that cannot be written is refused before the job is touched.
 //
+// An input that is DEBUG.DAT of the working directory is refused too: every reduction removes
+// that file as it starts, and it would take the user's data with it.
+//
 // Two paths are the same file when they lead to the same device and inode, whatever links or
 // spellings lead there.
 

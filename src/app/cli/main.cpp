@@ -17,7 +17,9 @@ const char* const kDescription = "Reads total-station observations held as neutr
 const char* const kFooter =
     "Run 'sxnedit COMMAND --help' for the options of a command.\n"
     "Exit status: 0 done, 1 failed (an output refused; for reduce also: the run did\n"
-    "not reach its end, or points that are no finite numbers were left out),\n"
+    "not reach its end, or points that are no finite numbers were left out; for\n"
+    "traverse adjust and doc traverse: the traverse was not adjusted; for transfer\n"
+    "and doc transfer: the transfer did not come to its end and was not kept),\n"
     "2 an input file could not be read, 64 the command line is wrong.\n"
     "Environment: SXNEDIT_DATA_DIR names the directory of the record definition,\n"
     "SXNEDIT_DRIVER_DIR the directory of the instrument drivers (else drivers/ beside\n"
@@ -65,6 +67,8 @@ int Run(int argc, char** argv) {
     CommandRun run;
     AddRowsCommand(app, run);
     AddReduceCommand(app, run);
+    AddTraverseCommands(app, run);
+    AddTransferCommand(app, run);
     AddJobCommands(app, run);
     AddDocCommands(app, run);
     AddInstrumentsCommand(app, run);

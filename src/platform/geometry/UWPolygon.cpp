@@ -1,5 +1,6 @@
 #include "platform/geometry/UWPolygon.h"
 
+#include <algorithm>
 #include <cstddef>
 #include <vector>
 
@@ -36,6 +37,28 @@ bool SegmentsMeet(const UWLine& a, const UWLine& b) {
            (s3 == 0 && WithinSegment(a.GetStart(), b)) || (s4 == 0 && WithinSegment(a.GetEnd(), b));
 }
 
+/// The box of a side, widened so that sides that touch within kCoarseTolerance overlap.
+struct SideBox {
+    std::size_t Side;
+    double MinX, MaxX, MinY, MaxY;
+};
+
+// The boxes of the sides of the closed outline through `corners`, by their western edge.
+std::vector<SideBox> SideBoxes(const std::vector<UWPoint>& corners) {
+    constexpr double kMargin = 10.0 * kCoarseTolerance;
+    std::vector<SideBox> boxes;
+    boxes.reserve(corners.size());
+    for (std::size_t i = 0; i < corners.size(); ++i) {
+        const UWPoint& from = corners[i];
+        const UWPoint& to = corners[(i + 1) % corners.size()];
+        boxes.push_back({i, std::min(from.x, to.x) - kMargin, std::max(from.x, to.x) + kMargin,
+                         std::min(from.y, to.y) - kMargin, std::max(from.y, to.y) + kMargin});
+    }
+    std::sort(boxes.begin(), boxes.end(),
+              [](const SideBox& a, const SideBox& b) { return a.MinX < b.MinX; });
+    return boxes;
+}
+
 // Whether the sides shared - to and shared - from run back over each other.
 bool FoldsBack(const UWPoint& to, const UWPoint& shared, const UWPoint& from) {
     const UWLine side(shared, to);
@@ -64,10 +87,20 @@ bool UWPolygon::IsSelfIntersecting() const {
         if (FoldsBack(corner(i), corner(i + 1), corner(i + 2))) {
             return true;
         }
-        for (std::size_t j = i + 2; j < n; ++j) {
-            if (i == 0 && j == n - 1) {
-                continue;  // the closing side neighbours the first
-            }
+    }
+    // Only sides whose boxes overlap can meet: the sides are swept from west to east, and each
+    // is tested against those that start before it ends, so that a long outline such as a
+    // traverse of thousands of stations is not tested side against every side.
+    const std::vector<SideBox> boxes = SideBoxes(corners);
+    for (std::size_t a = 0; a < n; ++a) {
+        const SideBox& first = boxes[a];
+        for (std::size_t b = a + 1; b < n && boxes[b].MinX <= first.MaxX; ++b) {
+            const SideBox& second = boxes[b];
+            const std::size_t i = std::min(first.Side, second.Side);
+            const std::size_t j = std::max(first.Side, second.Side);
+            // Neighbours share a corner; the closing side neighbours the first.
+            if (j - i < 2 || (i == 0 && j == n - 1)) continue;
+            if (second.MinY > first.MaxY || second.MaxY < first.MinY) continue;
             if (SegmentsMeet(UWLine(corner(i), corner(i + 1)), UWLine(corner(j), corner(j + 1)))) {
                 return true;
             }

@@ -59,7 +59,7 @@ int ReadPragma(JobDatabase& job, const char* pragma) {
 }  // namespace
 
 const std::vector<SchemaStep>& JobSchemaSteps() {
-    static const std::vector<SchemaStep> steps = {{1, kJobSchemaV1}};
+    static const std::vector<SchemaStep> steps = {{1, kJobSchemaV1}, {2, kJobSchemaV2}};
     return steps;
 }
 

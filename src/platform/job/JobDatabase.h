@@ -31,7 +31,7 @@ struct sqlite3;
 namespace nedit {
 
 /// The schema version that this program writes, and the marker of a job file ("SXNJ").
-constexpr int kJobSchemaVersion = 1;
+constexpr int kJobSchemaVersion = 2;
 constexpr int kJobApplicationId = 0x53584E4A;
 
 enum class JobAccess { ReadWrite, ReadOnly };

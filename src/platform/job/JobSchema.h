@@ -4,5 +4,6 @@
 namespace nedit {
 
 extern const char kJobSchemaV1[];
+extern const char kJobSchemaV2[];
 
 }  // namespace nedit

@@ -86,6 +86,15 @@ bool UDBObject::AddAttributes(const std::vector<nedit::AttributeRow>& attributes
             return false;
         }
     }
+    // Nothing to add: at most the old ones go, in one statement.
+    if (attributes.empty()) {
+        if (replace) {
+            Job().RequireWritable();
+            Job().Query("DELETE FROM attribute WHERE object_id = ?")->Bind(1, id_).Run();
+        }
+        last_error_.clear();
+        return true;
+    }
     return Guarded([&] {
         nedit::JobDatabase& job = Job();
         if (replace) job.Query("DELETE FROM attribute WHERE object_id = ?")->Bind(1, id_).Run();

@@ -362,6 +362,22 @@ int USurveyDoc::EnumerateArcs(UWorldDC* /*dc*/, USVSelectionList& list, const UW
         list, point);
 }
 
+long USurveyDoc::GetLineBetween(long a, long b) {
+    auto query = job_.Query(
+        "SELECT id FROM line WHERE (start_id = ?1 AND end_id = ?2) OR (start_id = ?2 AND end_id = "
+        "?1) ORDER BY id LIMIT 1");
+    query->Bind(1, a).Bind(2, b);
+    return query->Step() ? static_cast<long>(query->Int(0)) : 0;
+}
+
+long USurveyDoc::GetArcOn(long a, long b, long third) {
+    auto query = job_.Query(
+        "SELECT id FROM arc WHERE ((start_id = ?1 AND end_id = ?2) OR (start_id = ?2 AND end_id = "
+        "?1)) AND third_id = ?3 ORDER BY id LIMIT 1");
+    query->Bind(1, a).Bind(2, b).Bind(3, third);
+    return query->Step() ? static_cast<long>(query->Int(0)) : 0;
+}
+
 void USurveyDoc::Regen() {
     settings_ = nedit::LoadJobSettings(job_);
     code_settings_ = nedit::LoadCodeSettings(job_);

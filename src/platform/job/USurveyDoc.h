@@ -158,8 +158,18 @@ class USurveyDoc : public UDocument {
     int EnumerateArcs(UWorldDC* dc, USVSelectionList& list, const UWPoint& point,
                       USVSelectionList* points = nullptr, unsigned mask = 0);
 
+    /// The first line (by identifier) between the points `a` and `b`, in either direction: what
+    /// EnumerateLines at `a` finds with those ends. 0 when there is none.
+    long GetLineBetween(long a, long b);
+    /// The first arc with the ends `a` and `b`, in either order, and the third point `third`;
+    /// 0 when there is none.
+    long GetArcOn(long a, long b, long third);
+
     /// Reads the job's settings again from the file and updates all views.
     void Regen();
+    /// The hint of UpdateAllViews that asks the job's views to show all of the job, as after a
+    /// transfer into it.
+    static constexpr long kZoomAll = 1;
 
   private:
     const USvyCode* FindDefinition(std::wstring_view code, int& answer);

@@ -27,9 +27,9 @@ void WriteAll(int fd, const std::string& text) {
 }
 
 [[noreturn]] void RunChild(int fd, const std::string& path, const PluginCheck& check) {
-    // A library that faults while loading ends this child by its signal, which the parent
-    // names, whatever handler the program set (a sanitizer's turns a fault into an exit).
-    for (const int fault : {SIGSEGV, SIGBUS, SIGFPE, SIGILL}) signal(fault, SIG_DFL);
+    // A fault in the library ends the child by its signal, whatever handlers the program
+    // (or a sanitizer runtime) installed, so the parent can name it.
+    for (const int fault : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT}) signal(fault, SIG_DFL);
     std::string payload;
     std::string error;
     bool passed = false;

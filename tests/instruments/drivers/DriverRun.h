@@ -6,12 +6,34 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <fstream>
+#include <iterator>
 #include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
 
 #include "instruments/DriverCatalogue.h"
+
+/// The bytes of the raw file `name` of tests/data/raw.
+inline std::string RawFixture(const std::string& name) {
+    std::ifstream in(std::string(SXNEDIT_TEST_DATA) + "/raw/" + name, std::ios::binary);
+    return {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
+}
+
+/// How many of `records` begin with `start`.
+inline long CountOf(const std::vector<std::string>& records, const std::string& start) {
+    return std::count_if(records.begin(), records.end(),
+                         [&](const std::string& record) { return record.rfind(start, 0) == 0; });
+}
+
+/// The first of `records` that begins with `start`, or empty.
+inline std::string FirstOf(const std::vector<std::string>& records, const std::string& start) {
+    const auto found = std::find_if(records.begin(), records.end(), [&](const std::string& record) {
+        return record.rfind(start, 0) == 0;
+    });
+    return found == records.end() ? std::string() : *found;
+}
 
 class DriverRun {
   public:

@@ -4,20 +4,12 @@
 
 #include <gtest/gtest.h>
 
-#include <fstream>
-#include <iterator>
-
 #include "DriverRun.h"
 
 namespace {
 
 constexpr unsigned kDmsMetres = SXN_MODE_DMS | SXN_MODE_METRES;
 constexpr const char* kHeader = "#VERSION-1.0 NEUTRAL FILE";
-
-std::string Fixture(const std::string& name) {
-    std::ifstream in(std::string(SXNEDIT_TEST_DATA) + "/raw/" + name, std::ios::binary);
-    return {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
-}
 
 using Records = std::vector<std::string>;
 
@@ -184,7 +176,7 @@ TEST(GsiDriver, BlocksRunTogetherOnOneLineAndSplitAcrossReads) {
     ASSERT_EQ(whole.records.size(), 4u);
     EXPECT_EQ(whole.records[3], "SS ID=2,HA=90.000000,VA=90.000000,SD=2.000,CO=");
     EXPECT_EQ(gsi.Import(blocks, kDmsMetres, 1).records, whole.records);
-    const std::string fixture = Fixture("leica_gsi16_gurob.gsi");
+    const std::string fixture = RawFixture("leica_gsi16_gurob.gsi");
     EXPECT_EQ(gsi.Import(fixture, kDmsMetres, 7).records, gsi.Import(fixture, kDmsMetres).records);
 }
 
@@ -221,13 +213,13 @@ TEST(GsiDriver, TheLinkIsDeadWhenNothingCameForThePeriod) {
 // The fixtures, with values read by hand from their first and last blocks.
 TEST(GsiDriver, TheGsi8AndGsi16FixturesAsRecorded) {
     DriverRun gsi("gsi.so");
-    const auto gsi8 = gsi.Import(Fixture("RILIEVO.gsi"), SXN_MODE_GONS | SXN_MODE_METRES);
+    const auto gsi8 = gsi.Import(RawFixture("RILIEVO.gsi"), SXN_MODE_GONS | SXN_MODE_METRES);
     ASSERT_EQ(gsi8.records.size(), 2u + 23u);
     EXPECT_EQ(gsi8.records[2], "SS ID=100,HA=115.45200,VA=98.85300,SD=0.000,CO=,HD=0.000");
     EXPECT_EQ(gsi8.records[4], "SS ID=102,HA=132.47100,VA=103.78200,SD=5.165,CO=,HD=5.156");
     EXPECT_EQ(gsi8.records[24], "SS ID=122,HA=43.92100,VA=103.54100,SD=4.600,CO=,HD=4.593");
 
-    const auto gsi16 = gsi.Import(Fixture("leica_gsi16_gurob.gsi"), kDmsMetres);
+    const auto gsi16 = gsi.Import(RawFixture("leica_gsi16_gurob.gsi"), kDmsMetres);
     ASSERT_EQ(gsi16.records.size(), 3u + 343u);
     EXPECT_EQ(gsi16.records[2], "INSHT 1.324");
     EXPECT_EQ(gsi16.records[3], "SS ID=GDEM5415,HA=35.45100,VA=91.17510,SD=13.825,HT=1.300,CO=");

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <cmath>
 #include <initializer_list>
 #include <stdexcept>
 
@@ -92,4 +93,19 @@ TEST(UWPolygon, CrossingAndTouchingOutlines) {
     // Two distinct corners make no figure.
     EXPECT_FALSE(Make<UWPolygon>({UWPoint(0.0, 0.0), UWPoint(4.0, 0.0), UWPoint(4.0, 0.0)})
                      .IsSelfIntersecting());
+}
+
+TEST(UWPolygon, ALongOutlineCrossesItselfOnlyWhereItDoes) {
+    // A traverse of 5,000 stations on a circle, as a loop closes: no crossing, and then one
+    // corner moved across the far side of the figure.
+    constexpr int kCorners = 5000;
+    UWPolygon circle;
+    for (int i = 0; i < kCorners; ++i) {
+        const double theta = 2.0 * 3.14159265358979323846 * i / kCorners;
+        circle.Add(UWPoint(1000.0 * std::sin(theta), 1000.0 * std::cos(theta)));
+    }
+    EXPECT_FALSE(circle.IsSelfIntersecting());
+    UWPolygon crossed = circle;
+    crossed.SetAt(1200, UWPoint(-1200.0, 0.0));  // beyond the western side
+    EXPECT_TRUE(crossed.IsSelfIntersecting());
 }

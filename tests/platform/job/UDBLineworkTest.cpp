@@ -149,3 +149,38 @@ TEST_F(Linework, PolylinesKeepTheirVerticesAndAReplacedOneKeepsItsIdentifier) {
     EXPECT_FALSE(broken.Save());
     EXPECT_EQ(broken.GetId(), 0);
 }
+
+// The line between two points and the arc on three, as a transfer looks them up: in either
+// direction, the first of several, and an arc only with its own third point. Attributes
+// replaced by none go.
+TEST_F(Linework, LineBetweenAndArcOnTheirPointsAndAttributesReplacedByNone) {
+    const long a = Point(L"A", 0, 0);
+    const long b = Point(L"B", 10, 0);
+    const long c = Point(L"C", 5, 5);
+    EXPECT_EQ(job->GetLineBetween(a, b), 0);
+    UDBLine first(job.get());
+    first.SetPoints(b, a);
+    ASSERT_TRUE(first.Save());
+    UDBLine second(job.get());
+    second.SetPoints(a, b);
+    ASSERT_TRUE(second.Save());
+    EXPECT_EQ(job->GetLineBetween(a, b), first.GetId());
+    EXPECT_EQ(job->GetLineBetween(b, a), first.GetId());
+    EXPECT_EQ(job->GetLineBetween(a, c), 0);
+    UDBArc arc(job.get());
+    arc.SetPoints(a, b, c);
+    ASSERT_TRUE(arc.Save());
+    EXPECT_EQ(job->GetArcOn(b, a, c), arc.GetId());
+    EXPECT_EQ(job->GetArcOn(a, c, b), 0);
+
+    struct Attribute {
+        std::wstring Name, Type, Value;
+    };
+    ASSERT_TRUE(
+        first.AddAttributeObjectData(std::vector<Attribute>{{L"KIND", L"", L"KERB"}}, true));
+    ASSERT_EQ(first.GetAttributes().size(), 1u);
+    ASSERT_TRUE(first.AddAttributeObjectData(std::vector<Attribute>{}, false));
+    EXPECT_EQ(first.GetAttributes().size(), 1u);
+    ASSERT_TRUE(first.AddAttributeObjectData(std::vector<Attribute>{}, true));
+    EXPECT_TRUE(first.GetAttributes().empty());
+}

@@ -1,0 +1,6 @@
+#include "transfer/UToSvyDlg.h"
+
+bool UToSvyDlg::OnOK() {
+    SetStringTransferSettings(Settings);
+    return true;
+}
