@@ -65,6 +65,15 @@ void ReduceFieldSurvey(benchmark::State& state) {
     Reduce(state, nedit::SurveyShape());
 }
 
+// The same survey with its side shots coded into strings (second argument: how many) and with
+// the plain codes (0): 5,000 stations are 100k coded points. The ratio of the two is the cost
+// of the codes; the two sizes show how it grows.
+void ReduceCodedStrings(benchmark::State& state) {
+    nedit::SurveyShape shape = OneFace();
+    shape.strings = static_cast<int>(state.range(1));
+    Reduce(state, shape);
+}
+
 void ReduceUnknownBackStations(benchmark::State& state) {
     nedit::SurveyShape shape = OneFace();
     shape.unknownBackEvery = 1;
@@ -81,6 +90,12 @@ void ReduceUnpositionedStations(benchmark::State& state) {
 
 BENCHMARK(ReduceSurvey)->Arg(1'000)->Arg(10'000)->Arg(100'000)->Unit(benchmark::kMillisecond);
 BENCHMARK(ReduceFieldSurvey)->Arg(1'000)->Arg(10'000)->Arg(40'000)->Unit(benchmark::kMillisecond);
+BENCHMARK(ReduceCodedStrings)
+    ->Args({1'000, 0})
+    ->Args({1'000, 1'000})
+    ->Args({5'000, 0})
+    ->Args({5'000, 1'000})
+    ->Unit(benchmark::kMillisecond);
 BENCHMARK(ReduceUnknownBackStations)->Arg(2'000)->Arg(4'000)->Unit(benchmark::kMillisecond);
 BENCHMARK(ReduceUnpositionedStations)->Arg(2'000)->Arg(4'000)->Unit(benchmark::kMillisecond);
 BENCHMARK_MAIN();

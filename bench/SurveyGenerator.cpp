@@ -84,6 +84,20 @@ class Generator {
     double Heading = 0.0;
     long long NextPoint = 1000;
     long long SideShots = 0;
+
+    /// The code of the n-th side shot in a survey of coded strings.
+    std::string StringCode(long long shot) const {
+        static constexpr const char* kFeatures[] = {"KB", "FE", "BLD", "WL"};
+        const long long string = shot % Shape.strings;
+        const long long place = shot / Shape.strings;
+        std::string code = kFeatures[string % 4] + std::to_string(string / 4 + 1);
+        if (place % 10 == 3) code += "*AS";
+        if (place % 10 == 4) code += "*AE";
+        if (place % 50 == 20) code += "*RECT2.5";
+        if (place % 20 == 10 || place % 20 == 11) code += "*OS1.5";
+        if (place % 100 == 40) code += "*CR";
+        return code;
+    }
 };
 
 Position Generator::NextStation(const Position& from) {
@@ -172,14 +186,17 @@ void Generator::Station(int index, const Position& here, const Position* back,
         const Position point = Around(here, 5.0, 80.0);
         const double target_height = shot % 4 == 0 ? 2.0 : 1.6;
         const std::string point_name = std::to_string(NextPoint++);
-        const char* code = kCodes[Random() % (sizeof kCodes / sizeof kCodes[0])];
+        const char* plain = kCodes[Random() % (sizeof kCodes / sizeof kCodes[0])];
+        const std::string coded = Shape.strings > 0 ? StringCode(SideShots) : std::string();
+        const char* code = Shape.strings > 0 ? coded.c_str() : plain;
         for (int face = 0; face < faces; ++face) {
             Observation(
                 "SS", point_name,
                 Observe(here, instrument, point, target_height, back_bearing, zero, face == 1),
                 target_height, code);
         }
-        if (Shape.offsetEvery > 0 && ++SideShots % Shape.offsetEvery == 0) {
+        ++SideShots;
+        if (Shape.offsetEvery > 0 && SideShots % Shape.offsetEvery == 0) {
             // Drawn one after the other: the order of a call's arguments is the compiler's.
             const double along = Uniform(-0.5, 0.5);
             const double right = Uniform(-0.5, 0.5);

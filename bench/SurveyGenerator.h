@@ -30,6 +30,11 @@ struct SurveyShape {
     int unknownBackEvery = 0;
     /// Every n-th station is positioned by nothing in the file; 0 for none.
     int unpositionedEvery = 0;
+    /// With n above 0 the side shots are coded into n strings, one shot to each in turn
+    /// ("KB1", "FE1", "BLD1", "WL1", "KB2", ...), with tangent arcs, two-point rectangles,
+    /// offset runs and circles by radius among them; the positions stay those of the survey
+    /// with the plain codes.
+    int strings = 0;
     std::uint32_t seed = 1;
 };
 

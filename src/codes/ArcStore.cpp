@@ -14,22 +14,30 @@ int ArcStore::Save(const UNeditPt& first, const UNeditPt& second, const UNeditPt
     const int existing = Find(first.GetID(), second.GetID(), third.GetID(), type);
     if (existing >= 0) {
         Arcs[static_cast<std::size_t>(existing)] = std::move(arc);
+        // The arc is now found by its new stored type, unless an earlier arc holds that key.
+        if (stored != type) {
+            Index.erase(KeyOf(first.GetID(), second.GetID(), third.GetID(), type));
+            Index.emplace(KeyOf(first.GetID(), second.GetID(), third.GetID(), stored),
+                          static_cast<std::size_t>(existing));
+        }
         return existing;
     }
+    Index.emplace(KeyOf(first.GetID(), second.GetID(), third.GetID(), stored), Arcs.size());
     Arcs.push_back(std::move(arc));
     return static_cast<int>(Arcs.size()) - 1;
 }
 
 int ArcStore::Find(const std::wstring& a, const std::wstring& b, const std::wstring& third,
                    ArcType type) const {
-    for (std::size_t i = 0; i < Arcs.size(); ++i) {
-        const UNeditArc& arc = Arcs[i];
-        const bool ends = (arc.GetStartPt() == a && arc.GetEndPt() == b) ||
-                          (arc.GetStartPt() == b && arc.GetEndPt() == a);
-        if (ends && arc.GetThirdPt() == third && arc.GetArcType() == type)
-            return static_cast<int>(i);
-    }
-    return -1;
+    const auto found = Index.find(KeyOf(a, b, third, type));
+    return found == Index.end() ? -1 : static_cast<int>(found->second);
+}
+
+std::wstring ArcStore::KeyOf(const std::wstring& a, const std::wstring& b,
+                             const std::wstring& third, ArcType type) {
+    const bool ordered = a < b;
+    return (ordered ? a : b) + L'\x1f' + (ordered ? b : a) + L'\x1f' + third + L'\x1f' +
+           std::to_wstring(type);
 }
 
 }  // namespace nedit

@@ -2,6 +2,7 @@
 // A store of arcs through or about reduced points, in the order they came.
 
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 #include "codes/UNeditArc.h"
@@ -20,12 +21,23 @@ class ArcStore {
     /// `third` and whose stored type is `type`, or -1.
     int Find(const std::wstring& a, const std::wstring& b, const std::wstring& third,
              ArcType type) const;
-    void Clear() { Arcs.clear(); }
+    void Clear() {
+        Arcs.clear();
+        Index.clear();
+    }
 
     const std::vector<UNeditArc>& Items() const { return Arcs; }
+    /// The arc at an index the store holds, to set its look.
+    UNeditArc& At(std::size_t index) { return Arcs[index]; }
 
   private:
+    static std::wstring KeyOf(const std::wstring& a, const std::wstring& b,
+                              const std::wstring& third, ArcType type);
+
     std::vector<UNeditArc> Arcs;
+    /// Ends in either order, third point and stored type to the first arc of them, so that a
+    /// string of many arcs is saved in linear time.
+    std::unordered_map<std::wstring, std::size_t> Index;
 };
 
 }  // namespace nedit

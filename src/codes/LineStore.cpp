@@ -8,7 +8,9 @@ std::wstring LineStore::KeyOf(const std::wstring& a, const std::wstring& b) {
 }
 
 std::size_t LineStore::Save(const UNeditPt& from, const UNeditPt& to, bool stationLine) {
-    const int existing = IndexOf(from.GetID(), to.GetID());
+    std::wstring key = KeyOf(from.GetID(), to.GetID());
+    const auto found = Index.find(key);
+    const int existing = found == Index.end() ? -1 : static_cast<int>(found->second);
     const bool forward =
         existing < 0 || Lines[static_cast<std::size_t>(existing)].GetFromPt() == from.GetID();
     UNeditLine line = forward ? UNeditLine(from, to) : UNeditLine(to, from);
@@ -17,7 +19,7 @@ std::size_t LineStore::Save(const UNeditPt& from, const UNeditPt& to, bool stati
         Lines[static_cast<std::size_t>(existing)] = std::move(line);
         return static_cast<std::size_t>(existing);
     }
-    Index.emplace(KeyOf(from.GetID(), to.GetID()), Lines.size());
+    Index.emplace(std::move(key), Lines.size());
     Lines.push_back(std::move(line));
     return Lines.size() - 1;
 }

@@ -27,6 +27,8 @@ class LineStore {
     std::unordered_set<std::wstring> KeepStationLines();
 
     const std::vector<UNeditLine>& Items() const { return Lines; }
+    /// The line at an index the store holds, to set its look.
+    UNeditLine& At(std::size_t index) { return Lines[index]; }
     std::size_t size() const { return Lines.size(); }
 
   private:

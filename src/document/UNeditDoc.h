@@ -107,10 +107,9 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     int TransferToJob(const UNeditDatabase& engine, const std::wstring& source = L"");
     /// What the last transfer wrote and left out.
     const nedit::TransferReport& GetTransferReport() const { return LastTransfer; }
-    /// How point codes are read for the transfer; the reader must outlive the document.
-    void SetPointCodeReader(const nedit::PointCodeReader* reader) {
-        CodeReader = reader != nullptr ? reader : &WholeCodes;
-    }
+    /// How point codes are read for the transfer; the reader must outlive the document. Null
+    /// (the default) reads them by the job's code grammar.
+    void SetPointCodeReader(const nedit::PointCodeReader* reader) { CodeReader = reader; }
 
     // ---- Report and its parameters ------------------------------------------------------------
     int CreateNReport();
@@ -231,8 +230,7 @@ class UNeditDoc : public UDocument, public UNeutralFileFormat, public nedit::Rep
     std::unique_ptr<UDeviceManager> DeviceManager;
     unsigned ImportMode = 0;
     std::chrono::milliseconds DownloadTimeOut = kDownloadTimeOut;
-    nedit::PointCodeReader WholeCodes;
-    const nedit::PointCodeReader* CodeReader = &WholeCodes;
+    const nedit::PointCodeReader* CodeReader = nullptr;
     nedit::TransferReport LastTransfer;
 
     std::vector<XInput*> InputStack;

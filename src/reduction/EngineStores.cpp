@@ -40,6 +40,7 @@ unsigned UNeditDatabase::SavePointOf(NameId name, double x, double y, double z,
         PointOfName[name] = static_cast<std::int32_t>(index);
     }
     if (TravFlag) SaveTravPoint(id, x, y, z, point_code ? *point_code : std::wstring(), 0);
+    ProcessCircle(index, point_code ? *point_code : std::wstring());
     return index;
 }
 
@@ -72,8 +73,15 @@ int UNeditDatabase::SaveLine(unsigned from, unsigned to, int stationLine) {
     constexpr unsigned kNone = static_cast<unsigned>(-1);
     if (from == kNone || to == kNone || from >= PointList.size() || to >= PointList.size())
         return 0;
-    // Code, layer, colour, line type and thickness come from the survey code library.
-    LineList.Save(PointList[from], PointList[to], stationLine != 0);
+    UNeditLine& line = LineList.At(LineList.Save(PointList[from], PointList[to], stationLine != 0));
+    if (stationLine == 0) {
+        // A line outside string assembly takes the code and look of the point it reaches.
+        std::wstring code, string_name;
+        CodeOfLinework(PointList[to].GetCode(), code, string_name);
+        line.SetCode(code);
+        line.SetStringNo(string_name);
+        ApplyCodeLook(code, line);
+    }
     return 1;
 }
 

@@ -72,6 +72,7 @@ int UNeditDatabase::PrepareRows(std::size_t count, RowAt rowAt) {
     ResetPassValues();
     DeleteList();
     TravFlag = 0;
+    ChkShotCode = ChkCode;
     Filing = true;
     std::string text;
     std::string normalised;
@@ -203,6 +204,10 @@ int UNeditDatabase::ReadRecord(int type, std::string_view row, int recordNo) {
                 CurSS->OffsetAlong = Number(fld::OffsetAlong);
                 CurSS->OffsetRight = Number(fld::OffsetRight);
                 CurSS->OffsetUp = Number(fld::OffsetUp);
+            } else if (CurChkList && !CurChkList->empty()) {
+                CurChkList->back().OffsetAlong = Number(fld::OffsetAlong);
+                CurChkList->back().OffsetRight = Number(fld::OffsetRight);
+                CurChkList->back().OffsetUp = Number(fld::OffsetUp);
             }
             return 1;
         case rec::Insht:
@@ -348,6 +353,10 @@ void UNeditDatabase::ProcessObservation(int type, int recordNo) {
     if (CorrectDist && measurement.SDist >= 1e-40) ApplyDistanceCorrection(measurement);
     measurement.HtTarget = Number(fld::HT);
 
+    if (IsCheckShot(type, target.SSCode)) {
+        TakeCheckShot(target, measurement);
+        return;
+    }
     InsertSSMS(target, measurement, type == rec::Bs);
     if (type == rec::Bs) {
         CurStn->BkStnGiven = 1;

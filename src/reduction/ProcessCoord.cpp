@@ -13,6 +13,7 @@
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
 #include "records/RowSource.h"
+#include "reduction/StationWork.h"
 #include "reduction/UBKBCoordDlg.h"
 #include "reduction/UCoordEntryDlg.h"
 #include "reduction/UNeditDatabase.h"
@@ -23,23 +24,6 @@ namespace {
 constexpr const wchar_t* kGeneratingGraphics = L"Generating Graphics";
 
 }  // namespace
-
-/// What lives while one station is worked.
-struct UNeditDatabase::StationWork {
-    double StnE = 0.0;
-    double StnN = 0.0;
-    double StnZ = kNoHeight;
-    std::wstring StnCodeOut;
-    double BackBearing = 0.0;
-    double BsReading = 0.0;
-    std::size_t StepsDone = 0;
-    std::size_t Steps = 1;
-    bool HasShots = false;
-    bool HeadPrinted = false;
-    /// The blocks of stations and targets are written: there is a report, reporting is on,
-    /// and the report keeps its text (one that keeps none would only throw them away).
-    bool Printing = false;
-};
 
 void UNeditDatabase::geo_coord(double e, double n, double bearing, double dist, double* eOut,
                                double* nOut) {
@@ -61,6 +45,7 @@ bool UNeditDatabase::IsSelfObservation(const STNSTRUCT& station, const SSSTRUCT&
 
 void UNeditDatabase::ReduceTarget(const STNSTRUCT& station, SSSTRUCT& target,
                                   const StationWork& work, double& e, double& n, double& z) const {
+    Process_Code_Offsets(target);
     const double zenith = target.VAng * kRadiansPerDegree;
     const double horizontal = std::sin(zenith) * target.SDist + PrismConst;
     const double vertical = std::cos(zenith) * target.SDist;
@@ -88,6 +73,13 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
     for (const STNSTRUCT& station : Setups)
         work.Steps += station.SSList.size() + station.FSList.size();
     if (work.Steps == 0) work.Steps = 1;
+
+    Strings.DeleteStrNoList();
+    CodeNotices.clear();
+    if (report == 1) CheckResults.clear();
+    const STNSTRUCT* last_station = nullptr;
+    StationWork last_work;
+    ResetCircleData();
 
     const bool printing = Report != nullptr && report == 1;
     if (printing) PrintRunHead();
@@ -142,6 +134,7 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
             if (stored >= 0.0) work.BackBearing = stored;
         }
 
+        ArrangePtNames(station.PtNames.begin(), station.PtNames.end());
         work.HasShots = HaveSideshotsToReport(&station, records);
         work.HeadPrinted = false;
         // A side-shot pass alone (after an adjustment) prints only stations with shots.
@@ -155,9 +148,21 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
             !SideShotPass(station, work, report)) {
             aborted = true;
         }
+        if (report == 1) ProcessChkShot(station.ChkShots, station, work);
+        last_station = &station;
+        last_work = work;
     }
+    Strings.ProcessOffsetStringPoints();
+    if (report == 1 && last_station != nullptr && CurChkList) {
+        for (const SSCheck& check : *CurChkList) PrintChkShot(*last_station, last_work, check);
+    }
+    if (CurPtNames) ArrangePtNames(CurPtNames->data(), CurPtNames->data() + CurPtNames->size());
     UpdateProgress(100, L"");
-    return aborted ? 0 : 1;
+    if (printing) PrintUnDefineCode();
+    if (aborted) return 0;
+    ProcessString();
+    ShowCodeNotices(printing);
+    return 1;
 }
 
 int UNeditDatabase::OrientByCoordinates(STNSTRUCT& station, StationWork& work) {
@@ -338,16 +343,19 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
                        kGeneratingGraphics);
         // A traverse point keeps the position its adjustment gave it.
         if (IsTraversePoint(target.SSName)) continue;
+        ArrangePtNames(target.PtNames.begin(), target.PtNames.end());
         if (!work.HeadPrinted && work.Printing) {
             if (work.HasShots) Report->PrintSSHead();
             work.HeadPrinted = true;
         }
+        if (report == 1) ProcessChkShot(target.ChkShots, station, work);
         if (!target.AngleValid || target.ForwardFlag) continue;
         double e = 0.0, n = 0.0, z = kNoHeight;
         ReduceTarget(station, target, work, e, n, z);
         if (work.Printing) PrintTarget(station, target, e, n, z, false);
         if (IsSelfObservation(station, target)) continue;
         SetCoordOf(target.Name, e, n, z, target.SSCode, kSetCoordOverwrite, report, 0);
+        Arrange_SS_String(std::wstring(target.SSCode), std::wstring(target.SSName));
     }
     return 1;
 }

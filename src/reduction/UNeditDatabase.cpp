@@ -45,6 +45,8 @@ UNeditDatabase::UNeditDatabase(UNeutralFileFormat* format, nedit::RowSource* row
       ChkCode(chkCode.empty() ? L"*CHK" : chkCode) {
     // Older field programs left a debugging file behind; an engine clears it away.
     std::remove("DEBUG.DAT");
+    LoadSvyCodeCtrl();
+    if (!chkCode.empty()) ChkCode = chkCode;
     InitUnitsAndAngleModes();
     DeleteTopoLines();
 }
@@ -106,6 +108,7 @@ int UNeditDatabase::Process() {
         return 0;
     }
     CorrectDist = false;
+    ResetCircleData();
     if (!PrepareList() || !PrepareForwardNoBS()) return 0;
     LoadBearingArray();
     ProcessAverageMeas();
@@ -115,6 +118,7 @@ int UNeditDatabase::Process() {
     SetMinMaxCoord();
     if (result == 0) return 0;
     RunStages(nedit::RunStep::Routes);
+    ProcessAttachments();
     RunStages(nedit::RunStep::Attachments);
     return 1;
 }
@@ -124,6 +128,7 @@ void UNeditDatabase::RunStages(nedit::RunStep step) {
 }
 
 void UNeditDatabase::ResetForRerun() {
+    LoadSvyCodeCtrl();
     DeleteList();
     SaveBearingArray();
     DeleteBearingArray();

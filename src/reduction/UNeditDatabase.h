@@ -23,8 +23,14 @@
 #include <vector>
 
 #include "codes/ArcStore.h"
+#include "codes/CodeGeometryHost.h"
 #include "codes/LineStore.h"
 #include "codes/PointStore.h"
+#include "codes/StringAssembly.h"
+#include "codes/StringFiling.h"
+#include "codes/UCircleCommandMgr.h"
+#include "codes/UNeditCircle.h"
+#include "codes/USvyCodeCtrl.h"
 #include "platform/geometry/UWCircle.h"
 #include "platform/geometry/UWRect.h"
 #include "platform/text/NameTable.h"
@@ -32,6 +38,7 @@
 #include "records/RecordFields.h"
 #include "records/UNeutralFileFormat.h"
 #include "reduction/CError.h"
+#include "reduction/CheckResult.h"
 #include "reduction/ObservationModel.h"
 #include "reduction/RowIndex.h"
 #include "reduction/RunRows.h"
@@ -58,7 +65,7 @@ struct KnownCoord {
 /// lives on from one run and one document to the next, as field software has always kept it.
 extern double CurInstHt;
 
-class UNeditDatabase {
+class UNeditDatabase : private nedit::CodeGeometryHost {
   public:
     /// The engine of a document: its format service, rows (the record list), job and dialog
     /// host, each of which may be null. `chkCode` is the check code, "*CHK" when empty.
@@ -260,6 +267,13 @@ class UNeditDatabase {
     int SearchArc(const std::wstring& a, const std::wstring& b, const std::wstring& third,
                   ArcType type) const;
 
+    // ---- Images, attributes and notes (Attachments.cpp) ---------------------------------
+    /// The walks below that the rows have records for; Process calls it last.
+    void ProcessAttachments();
+    int ProcessImages();
+    int ProcessPointAttributes();
+    int ProcessPointNotes();
+
     // ---- Derived points back into the rows --------------------------------------------
     /// Writes the adjusted points as XYZ rows behind the marker row, making the marker when
     /// there is none. 1 when rows were written.
@@ -283,12 +297,75 @@ class UNeditDatabase {
     const std::vector<UNeditPt>& GetAddPtList() const { return AddPtList.Items(); }
     const std::vector<UNeditLine>& GetLineList() const { return LineList.Items(); }
     const std::vector<UNeditArc>& GetArcList() const { return ArcList.Items(); }
-    const std::vector<UWCircle>& GetCircleList() const { return CircleList; }
+    const std::vector<UNeditCircle>& GetCircleList() const { return CircleList; }
+
+    // ---- Field codes: strings, shapes, circles (EngineCodes.cpp) -----------------------
+    /// Takes the code grammar from the job's settings (the defaults without a job) and the
+    /// check code from it.
+    int LoadSvyCodeCtrl();
+    const USvyCodeCtrl& GetSvyCodeCtrl() const { return SvyCodeCtrl; }
+    /// Files a reduced point under every group of its code.
+    void Arrange_SS_String(const std::wstring& code, const std::wstring& name);
+    /// Files the points of PT records, by name, under their codes.
+    void Arrange_PT_String(const std::vector<std::wstring>& names) {
+        ArrangePtNames(names.data(), names.data() + names.size());
+    }
+    /// Turns the strings into lines and arcs.
+    void ProcessString();
+    /// Offers a saved point to the circle commands.
+    void ProcessCircle(unsigned index, const std::wstring& code);
+    void ResetCircleData();
+    /// Offsets written in a target's code ("@along,right,up") replace the record's, each only
+    /// when it is not zero. 1, as the code control is always there.
+    int Process_Code_Offsets(SSSTRUCT& target) const;
+    /// Prints the codes that no library defines.
+    void PrintUnDefineCode();
+    /// The name of the known point written behind the check code ("*CHK P12" gives P12);
+    /// false, leaving `name` alone, when there is none.
+    bool GetChkPtName(const std::wstring& code, std::wstring& name) const;
+    /// The check shots of the last run with a report, in the order they were printed.
+    const std::vector<CheckResult>& GetChecks() const { return CheckResults; }
+    const std::vector<CStrNoList>& GetStrings() const { return Strings.Strings(); }
+    const std::map<std::wstring, int>& GetUndefinedCodes() const {
+        return Strings.UndefinedCodes();
+    }
+    /// Codes the run could not turn into the geometry they ask for, in the order met.
+    const std::vector<std::wstring>& GetCodeNotices() const { return CodeNotices; }
 
     /// The messages of the coordinate dialogs go to this host; null answers by default.
     nedit::DialogHost* GetDialogHost() const { return Host; }
 
   private:
+    // The engine's side of the string filing and assembly (EngineCodes.cpp).
+    int PointIndex(const std::wstring& name) const override;
+    const UNeditPt& PointAt(unsigned index) const override;
+    unsigned SaveDerivedPoint(const std::wstring& name, double x, double y,
+                              const std::wstring& code) override;
+    int SaveStringLine(unsigned from, unsigned to, const std::wstring& code,
+                       const std::wstring& stringName) override;
+    void SaveStringArc(const UNeditPt& first, const UNeditPt& second, const UNeditPt& third,
+                       ArcType type) override;
+    double CodeDistance(double value) const override;
+    bool StopRequested() const override { return AbortRequested(); }
+    void StringProgress(unsigned percent) override;
+    void CodeNotice(const std::wstring& text) override;
+    void ArrangePtNames(const std::wstring* first, const std::wstring* last);
+    /// One message naming every code the run could not turn into its geometry.
+    void ShowCodeNotices(bool printing);
+    /// The feature code and the string name a line or arc of a point's code takes.
+    void CodeOfLinework(const std::wstring& pointCode, std::wstring& code,
+                        std::wstring& stringName) const;
+    /// Layer, colour, line type and thickness of a code, from the job's library.
+    void ApplyCodeLook(const std::wstring& code, UNeditLinework& linework) const;
+
+    /// Calls take(type, false) for each row with a record type: true asks for the record to
+    /// be parsed, and take(type, true) follows with its fields in hand.
+    template <typename Take>
+    void EachRecord(Take take);
+    // Check shots (CheckShots.cpp).
+    bool IsCheckShot(int type, std::wstring_view code) const;
+    void TakeCheckShot(const SSSTRUCT& target, const MEASSTRUCT& measurement);
+
     bool AbortRequested() const;
     void RunStages(nedit::RunStep step);
     void ResetForRerun();
@@ -383,6 +460,9 @@ class UNeditDatabase {
     int SideShotPass(STNSTRUCT& station, StationWork& work, int report);
     bool IsSelfObservation(const STNSTRUCT& station, const SSSTRUCT& target) const;
     // The report's part of the walk; called only with a report and reporting on.
+    void ProcessChkShot(const SparseList<SSCheck>& checks, const STNSTRUCT& station,
+                        const StationWork& work);
+    void PrintChkShot(const STNSTRUCT& station, const StationWork& work, const SSCheck& check);
     void PrintRunHead();
     void PrintStationBlock(const STNSTRUCT& station, const StationWork& work);
     void PrintTarget(const STNSTRUCT& station, const SSSTRUCT& target, double e, double n, double z,
@@ -478,7 +558,16 @@ class UNeditDatabase {
     std::unordered_set<std::wstring> TravPtKeys;
     nedit::LineStore LineList;
     nedit::ArcStore ArcList;
-    std::vector<UWCircle> CircleList;
+    std::vector<UNeditCircle> CircleList;
+
+    // Field codes.
+    USvyCodeCtrl SvyCodeCtrl;
+    nedit::StringFiling Strings{SvyCodeCtrl, SurveyDoc, *this};
+    nedit::StringAssembly Assembly{SvyCodeCtrl, *this};
+    UCircleCommandMgr CircleMgr;
+    std::unordered_set<int> CirclePoints;
+    std::vector<std::wstring> CodeNotices;
+    std::vector<CheckResult> CheckResults;
     double XMin = -1e12, YMin = -1e12, XMax = -1e12, YMax = -1e12;
     unsigned LastPercent = 1000;  // none reported yet
     std::wstring LastProgressText;

@@ -3,10 +3,10 @@
 // number, a comment, commands, contour and flag values and symbol values) and whether a group
 // holds a command. This is the part of the job's code grammar that the transfer asks of it.
 //
-// Decision: this class itself reads a code as one group whose feature code is the whole code,
-// trimmed, with nothing else stated; an empty code is one empty group. So points keep their
-// codes as they were recorded until the code grammar reads them for the transfer: a grammar
-// derives from this class and is handed to the run in its place.
+// This class itself reads a code as one group whose feature code is the whole code, trimmed,
+// with nothing else stated; an empty code is one empty group. The transfer of a document reads
+// codes by the job's grammar (CodeGrammarReader, derived from this class); this plain reading
+// serves callers that hand it in on purpose.
 
 #include <string>
 #include <vector>

@@ -216,4 +216,27 @@ wait "$reader"
 [ -p "$work/points.fifo" ] && grep -q '^P1,' "$work/from-fifo" && passed=$((passed + 1)) ||
     { echo "FAIL points-to-fifo: the pipe was replaced or its reader got nothing"; failed=$((failed + 1)); }
 
+# Check shots against the known point CP (1010, 2000, 50) from S1 (1000, 2000, 50), every
+# shot level with instrument and target at 1.5: CP at 10.005 m East lands 5 mm beyond CP,
+# X1 on face 2 (reading 270, zenith 270, folded to 90 and 90) at 10.020 m lands 2 cm beyond,
+# and X2, offset 0.5 to the right of a line of sight due East, lands 0.5 m South of CP.
+"$sxnedit" reduce "$data/check_shots.neu" --json >"$work/checks.json" 2>/dev/null
+"$sxnedit" reduce "$data/check_shots.neu" --report - >"$work/checks.report" 2>/dev/null
+if python3 - "$work/checks.json" <<'PY' && [ "$(grep -c 'CHECK POINT' "$work/checks.report")" -eq 3 ]
+import json, sys
+checks = {c["id"]: c for c in json.load(open(sys.argv[1]))["checks"]}
+want = {"CP": (0.005, 0.0, 0.005), "X1": (0.020, 0.0, 0.020), "X2": (0.0, -0.5, 0.0)}
+ok = set(checks) == set(want)
+for name, (de, dn, dd) in want.items():
+    d = checks[name]["differences"]
+    ok = ok and abs(d["e"] - de) < 1e-9 and abs(d["n"] - dn) < 1e-9 and abs(d["distance"] - dd) < 1e-9
+    ok = ok and checks[name]["point"] == "CP" and d["h"] == 0
+sys.exit(0 if ok else 1)
+PY
+then
+    passed=$((passed + 1))
+else
+    echo "FAIL check-shots"; cat "$work/checks.json"; failed=$((failed + 1))
+fi
+
 finish cli

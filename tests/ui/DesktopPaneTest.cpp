@@ -295,14 +295,15 @@ void DesktopPaneTest::saveToSurveyWritesTheReducedSurveyIntoTheJob() {
     QVERIFY(job != nullptr);
     QVERIFY(example.Window().IsCommandEnabled(cmd::Transfer));
     QVERIFY(example.Window().RunCommand(cmd::Transfer));
-    // The point code settings are asked, then the ten points and four station lines go in.
+    // The point code settings are asked, then the ten points go in, with the four station
+    // lines and the three lines of the string FC01 (P1, P2, P4, P5).
     QCOMPARE(example.Host().FormsShown().back(), QStringLiteral("Point Code"));
     auto count = [job](const char* table) {
         auto query = job->Database().Query(std::string("SELECT count(*) FROM ") + table);
         return query->Step() ? query->Int(0) : -1;
     };
     QCOMPARE(count("point"), 10);
-    QCOMPARE(count("line"), 4);
+    QCOMPARE(count("line"), 7);
     QCOMPARE(example.Pane().GetDocument()->GetTransferReport().End, TransferEnd::Finished);
     // A second transfer finds every point equal and writes them again without a question.
     QVERIFY(example.Window().RunCommand(cmd::Transfer));

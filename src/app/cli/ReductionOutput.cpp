@@ -68,6 +68,42 @@ void EachReducedPoint(const UNeditDatabase& engine,
     }
 }
 
+// A position as {"e", "n", "h"}, the height null when there is none.
+json::Value Position(double e, double n, double h) {
+    return {{"e", e}, {"n", n}, {"h", h > kNoHeight ? json::Value(h) : json::Value(nullptr)}};
+}
+
+// A reduced point as the JSON of a run gives it: the members of a point, whether it was
+// derived by computation, and what is attached to it, on the points that have it.
+std::string ReducedPointJson(const UNeditPt& point) {
+    json::Value row = {{"id", json::Text(point.GetID())},
+                       {"e", point.x},
+                       {"n", point.y},
+                       {"h", point.z > kNoHeight ? json::Value(point.z) : json::Value(nullptr)},
+                       {"code", json::Text(point.GetCode())},
+                       {"derived", point.IsPTInterpolated()}};
+    if (point.GetPointAttributeSize() > 0) {
+        json::Value attributes = json::Value::array();
+        for (const UAttributeObject& attribute : point.GetPointAttributes()) {
+            attributes.push_back({{"name", json::Text(attribute.Name)},
+                                  {"type", json::Text(attribute.Type)},
+                                  {"value", json::Text(attribute.Value)}});
+        }
+        row["attributes"] = attributes;
+    }
+    if (point.GetImageSize() > 0) {
+        json::Value images = json::Value::array();
+        for (const UAttachedImageFile& image : point.GetImages()) {
+            images.push_back({{"file", json::Text(image.FileName)},
+                              {"number1", image.Number1},
+                              {"number2", image.Number2}});
+        }
+        row["images"] = images;
+    }
+    if (!point.GetNote().empty()) row["notes"] = json::Value::array({json::Text(point.GetNote())});
+    return json::Inline(row);
+}
+
 // The report on standard output, ended by a line feed. Like a C string, it ends at a NUL.
 void PrintReport(const UNeditReport& report) {
     char last = '\n';
@@ -101,10 +137,11 @@ bool WriteReductionJson(const UNeditDatabase& engine, const std::vector<std::wst
     };
     {
         json::RowWriter points(out, 2);
-        EachReducedPoint(engine, [&](const PointRow& point) {
-            points.Row(PointJson(point));
+        for (const UNeditPt& point : engine.GetPointList()) {
+            if (!IsFinite(point)) continue;
+            points.Row(ReducedPointJson(point));
             flush(false);
-        });
+        }
         points.End();
     }
     // A member that is an array of rows; an item that gives no row is left out.
@@ -121,22 +158,67 @@ bool WriteReductionJson(const UNeditDatabase& engine, const std::vector<std::wst
         }
         rows.End();
     };
+    member("strings", engine.GetStrings(), [&engine](const CStrNoList& string) {
+        // A string names the points of the JSON: none that was not reduced or left out.
+        json::Value names = json::Value::array();
+        for (const CStrList& element : string.StrList) {
+            const int index = engine.GetPointIdx(element.PtName);
+            if (index >= 0 && IsFinite(engine.GetPointList()[static_cast<std::size_t>(index)]))
+                names.push_back(json::Text(element.PtName));
+        }
+        return json::Inline({{"code", json::Text(string.Code)},
+                             {"number", json::Text(string.StrNo)},
+                             {"points", names}});
+    });
     member("lines", engine.GetLineList(), [](const UNeditLine& line) {
         return json::Inline({{"from", json::Text(line.GetFromPt())},
                              {"to", json::Text(line.GetToPt())},
-                             {"station_line", line.GetStationLine() != 0}});
+                             {"station_line", line.GetStationLine() != 0},
+                             {"code", json::Text(line.GetCode())}});
     });
     member("arcs", engine.GetArcList(), [](const UNeditArc& arc) {
+        const UWPoint centre = arc.ComputeCentre();
+        if (!IsFinite(centre) || !std::isfinite(arc.ComputeRadius())) return std::string();
         return json::Inline({{"start", json::Text(arc.GetStartPt())},
                              {"end", json::Text(arc.GetEndPt())},
                              {"third", json::Text(arc.GetThirdPt())},
-                             {"type", arc.GetArcType()}});
+                             {"type", arc.GetArcType()},
+                             {"centre", {{"e", centre.x}, {"n", centre.y}}},
+                             {"radius", arc.ComputeRadius()},
+                             {"code", json::Text(arc.GetCode())}});
     });
-    member("circles", engine.GetCircleList(), [](const UWCircle& circle) {
+    member("circles", engine.GetCircleList(), [](const UNeditCircle& circle) {
         if (!IsFinite(circle)) return std::string();
         return json::Inline({{"e", circle.GetCentre().x},
                              {"n", circle.GetCentre().y},
-                             {"radius", circle.GetRadius()}});
+                             {"radius", circle.GetRadius()},
+                             {"centre", {{"e", circle.GetCentre().x}, {"n", circle.GetCentre().y}}},
+                             {"code", json::Text(circle.GetCode())}});
+    });
+    member("checks", engine.GetChecks(), [](const CheckResult& check) {
+        const bool finite = std::isfinite(check.E) && std::isfinite(check.N) &&
+                            std::isfinite(check.KnownE) && std::isfinite(check.KnownN);
+        if (!finite) return std::string();
+        json::Value row = {{"id", json::Text(check.Id)},
+                           {"station", json::Text(check.Station)},
+                           {"point", json::Text(check.KnownName)},
+                           {"observed", Position(check.E, check.N, check.H)}};
+        // A known point that could not be had has no known position and no differences.
+        if (check.Known) {
+            const bool heights = check.H > kNoHeight && check.KnownH > kNoHeight;
+            row["known"] = Position(check.KnownE, check.KnownN, check.KnownH);
+            row["differences"] = {
+                {"e", check.E - check.KnownE},
+                {"n", check.N - check.KnownN},
+                {"h", heights ? json::Value(check.H - check.KnownH) : json::Value(nullptr)},
+                {"bearing", check.BearingDiff},
+                {"distance", check.DistanceDiff}};
+            row["bearing"] = check.Bearing;
+            row["known_bearing"] = check.KnownBearing;
+            row["distance"] = check.Distance;
+            row["known_distance"] = check.KnownDistance;
+        }
+        return json::Inline(row);
     });
     json::Value said = json::Value::array();
     for (const std::wstring& message : messages) said.push_back(json::Text(message));
