@@ -15,6 +15,11 @@ struct Precedence {
     bool secondWins;
 };
 
+// A case prints as its name, so that the names of the tests do not carry its bytes.
+void PrintTo(const Precedence& precedence, std::ostream* out) {
+    *out << precedence.what;
+}
+
 class PointPrecedence : public ::testing::TestWithParam<Precedence> {};
 
 }  // namespace

@@ -21,6 +21,11 @@ struct ArcCase {
     UWPoint middle;  // the point half way along
 };
 
+// A case prints as its name, so that the names of the tests do not carry its bytes.
+void PrintTo(const ArcCase& arc, std::ostream* out) {
+    *out << arc.name;
+}
+
 class BulgeArcCases : public ::testing::TestWithParam<ArcCase> {};
 
 TEST_P(BulgeArcCases, CentreRadiusSweepAndMiddle) {

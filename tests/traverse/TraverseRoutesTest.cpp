@@ -89,6 +89,11 @@ struct SearchCase {
     std::vector<std::wstring> routes;
 };
 
+// A case prints as its name, so that the names of the tests do not carry its bytes.
+void PrintTo(const SearchCase& search, std::ostream* out) {
+    *out << search.name;
+}
+
 class RouteSearch : public TraverseFixture, public ::testing::WithParamInterface<SearchCase> {};
 
 TEST_P(RouteSearch, FindsTheRoutes) {
