@@ -116,9 +116,12 @@ int UNeditDatabase::FindAverageMeas(const MeasurementList& measurements, double&
 }
 
 int UNeditDatabase::ProcessAverageMeas() {
-    // Point-only nodes have nothing to average; they count one step each.
-    std::size_t steps = Nodes.size();
-    for (const STNSTRUCT& station : Setups) steps += station.SSList.size() + station.FSList.size();
+    // Point-only nodes have nothing to average; they count one step each. The steps are
+    // counted over the set-ups walked, which hold the station of a last STN record that never
+    // joined the list: counted over the list's nodes, a file ending in one divided by zero.
+    std::size_t steps = PointNodes.size();
+    for (const STNSTRUCT& station : Setups)
+        steps += 1 + station.SSList.size() + station.FSList.size();
     std::size_t done = PointNodes.size();
     for (STNSTRUCT& station : Setups) {
         if (AbortRequested()) return 0;

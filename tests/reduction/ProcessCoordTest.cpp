@@ -196,3 +196,22 @@ TEST_F(Reduction, BadObservationsNeverGiveNaN) {
     ExpectPoint(L"A", 0.0, 0.0, 0.0);
     ExpectPoint(L"Y", 0.0, 0.0, 0.0);
 }
+
+TEST_F(Reduction, AFileEndingInAStationReducesWhatCameBefore) {
+    // The station of a last STN record never joins the list; the run once divided by zero
+    // counting its progress. Alone, or after a set-up, or as a check station, it must reduce.
+    for (const wchar_t* last : {L"STN ID=C\n", L"STN ID=C,CO=*CHK\n", L"STN ID=C\nSTN ID=D\n"}) {
+        Rows(std::wstring(L"#VERSION-1.0 NEUTRAL FILE\nUNIT UL=M,UA=D\n") + last);
+        EXPECT_EQ(engine.Process(), 1);
+        Rows(std::wstring(L"#VERSION-1.0 NEUTRAL FILE\n"
+                          L"UNIT UL=M,UA=D\n"
+                          L"STN ID=A,HI=1.500\n"
+                          L"XYZ ID=A,E=1000,N=2000,H=50\n"
+                          L"BKB ID=B,BRG=45,HA=0\n"
+                          L"SS ID=P1,HA=90,VA=90,SD=100.000,HT=1.500\n") +
+             last);
+        ASSERT_EQ(engine.Process(), 1);
+        // P1 on bearing 135 at 100 m level, as without the last record.
+        ExpectPoint(L"P1", 1070.7106781, 1929.2893219, 50.0);
+    }
+}
