@@ -4,6 +4,7 @@
 #include <cmath>
 
 #include "platform/geometry/UAngle.h"
+#include "reduction/ProgressPercent.h"
 #include "reduction/UNeditDatabase.h"
 
 namespace {
@@ -116,9 +117,8 @@ int UNeditDatabase::FindAverageMeas(const MeasurementList& measurements, double&
 }
 
 int UNeditDatabase::ProcessAverageMeas() {
-    // Point-only nodes have nothing to average; they count one step each. The steps are
-    // counted over the set-ups walked, which hold the station of a last STN record that never
-    // joined the list: counted over the list's nodes, a file ending in one divided by zero.
+    // Point-only nodes have nothing to average; they count one step each. The set-ups walked
+    // include the station of a last STN record, which never joins the list's nodes.
     std::size_t steps = PointNodes.size();
     for (const STNSTRUCT& station : Setups)
         steps += 1 + station.SSList.size() + station.FSList.size();
@@ -126,7 +126,7 @@ int UNeditDatabase::ProcessAverageMeas() {
     for (STNSTRUCT& station : Setups) {
         if (AbortRequested()) return 0;
         done += 1 + station.SSList.size() + station.FSList.size();
-        UpdateProgress(static_cast<unsigned>(100 * done / steps), kGeneratingGraphics);
+        UpdateProgress(ProgressPercent(done, steps), kGeneratingGraphics);
         for (SSSTRUCT* target : station.BSList) AverageTarget(*this, *target);
         for (SSSTRUCT* target : station.FSList) AverageTarget(*this, *target);
         for (SSSTRUCT* target : station.SSList) {

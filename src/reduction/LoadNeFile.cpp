@@ -10,6 +10,7 @@
 #include "records/RecordTypes.h"
 #include "records/RowSource.h"
 #include "records/UNeutralFileFormat.h"
+#include "reduction/ProgressPercent.h"
 #include "reduction/UNeditDatabase.h"
 
 namespace {
@@ -49,10 +50,8 @@ int UNeditDatabase::LoadNeFile(const std::wstring& path) {
     std::string line;
     std::string row;
     for (int lines_read = 0; reader.ReadLine(bytes); ++lines_read) {
-        if (lines_read % kProgressEvery == 0 && reader.Size() > 0) {
-            UpdateProgress(static_cast<unsigned>(100 * reader.Position() / reader.Size()),
-                           L"Loading");
-        }
+        if (lines_read % kProgressEvery == 0 && reader.Size() > 0)
+            UpdateProgress(ProgressPercent(reader.Position(), reader.Size()), L"Loading");
         const std::string_view trimmed = nedit::TrimView(nedit::TextLineAsUtf8(bytes, decoded));
         if (trimmed.empty()) continue;
         nedit::ToUpperUtf8(trimmed, line);

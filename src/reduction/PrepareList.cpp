@@ -12,6 +12,7 @@
 #include "records/RecordText.h"
 #include "records/RecordTypes.h"
 #include "records/RowSource.h"
+#include "reduction/ProgressPercent.h"
 #include "reduction/UNeditDatabase.h"
 
 double CurInstHt = 0.0;
@@ -81,7 +82,7 @@ int UNeditDatabase::PrepareRows(std::size_t count, RowAt rowAt) {
             Filing = false;
             return 0;
         }
-        UpdateProgress(static_cast<unsigned>(100 * (index + 1) / count), kGeneratingGraphics);
+        UpdateProgress(ProgressPercent(index + 1, count), kGeneratingGraphics);
         const std::string_view row = RowAsRead(rowAt(index, text), normalised);
         if (row == std::string_view("##########ADJUSTED-POINTS")) TravFlag = 1;
         const int type = Doc != nullptr ? Doc->GetRecordTypeUtf8(row) : rec::None;
@@ -570,15 +571,13 @@ int UNeditDatabase::PrepareForwardNoBS() {
     for (std::size_t s = 0; s < Setups.size(); ++s) {
         STNSTRUCT& station = Setups[s];
         if (AbortRequested()) return 0;
-        UpdateProgress(static_cast<unsigned>(100 * ++done / std::max<std::size_t>(steps, 1)),
-                       kGeneratingGraphics);
+        UpdateProgress(ProgressPercent(++done, steps), kGeneratingGraphics);
         if (station.PointOnly || station.ReverseStn) continue;
         for (const SSSTRUCT* forward : station.FSList)
             copied[forward->Name] = static_cast<std::uint32_t>(s);
         for (std::size_t t = 0; t < station.SSList.size(); ++t) {
             SSSTRUCT* target = station.SSList.at(t);
-            UpdateProgress(static_cast<unsigned>(100 * ++done / std::max<std::size_t>(steps, 1)),
-                           kGeneratingGraphics);
+            UpdateProgress(ProgressPercent(++done, steps), kGeneratingGraphics);
             if (target->SkipMean) continue;
             // Reverse nodes of the name join its chain as it is walked; they are passed over.
             for (std::uint32_t node = FirstNodeOf(target->Name); node != NodeEntry::kNone;

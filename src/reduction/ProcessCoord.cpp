@@ -13,6 +13,7 @@
 #include "platform/text/WideText.h"
 #include "records/RecordTypes.h"
 #include "records/RowSource.h"
+#include "reduction/ProgressPercent.h"
 #include "reduction/StationWork.h"
 #include "reduction/UBKBCoordDlg.h"
 #include "reduction/UCoordEntryDlg.h"
@@ -72,7 +73,6 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
     work.Steps = Nodes.size();
     for (const STNSTRUCT& station : Setups)
         work.Steps += station.SSList.size() + station.FSList.size();
-    if (work.Steps == 0) work.Steps = 1;
 
     Strings.DeleteStrNoList();
     CodeNotices.clear();
@@ -98,8 +98,7 @@ int UNeditDatabase::ProcessCoord(int passes, int report, int fixedOnly,
             station.Sighted == 0 && !station.HasCheck) {
             continue;
         }
-        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps),
-                       kGeneratingGraphics);
+        UpdateProgress(ProgressPercent(++work.StepsDone, work.Steps), kGeneratingGraphics);
 
         work.BackBearing = 0.0;
         work.BsReading = station.BkAngle;
@@ -313,8 +312,7 @@ int UNeditDatabase::ForwardPass(STNSTRUCT& station, StationWork& work, int repor
             work.HeadPrinted = true;
         }
         if (AbortRequested()) return 0;
-        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps),
-                       kGeneratingGraphics);
+        UpdateProgress(ProgressPercent(++work.StepsDone, work.Steps), kGeneratingGraphics);
         if (!TravPtList.empty() && GetTravPointIdx(std::wstring(target.SSName)) >= 0) {
             const int to = PointOf(target.Name);
             if (from >= 0 && to >= 0 && from != to)
@@ -339,8 +337,7 @@ int UNeditDatabase::SideShotPass(STNSTRUCT& station, StationWork& work, int repo
     for (std::size_t t = 0; t < station.SSList.size(); ++t) {
         SSSTRUCT& target = *station.SSList.at(t);
         if (AbortRequested()) return 0;
-        UpdateProgress(static_cast<unsigned>(100 * ++work.StepsDone / work.Steps),
-                       kGeneratingGraphics);
+        UpdateProgress(ProgressPercent(++work.StepsDone, work.Steps), kGeneratingGraphics);
         // A traverse point keeps the position its adjustment gave it.
         if (IsTraversePoint(target.SSName)) continue;
         ArrangePtNames(target.PtNames.begin(), target.PtNames.end());
